@@ -1,0 +1,69 @@
+#ifndef ALDERMOOR_UTILITIES_TOOLS_TREE_H
+#define ALDERMOOR_UTILITIES_TOOLS_TREE_H
+
+#include <list>
+
+#include "aldermoor/utilities/exceptions/frame.h"
+#include "aldermoor/utilities/tools/smartpointer.h"
+#include "aldermoor/utilities/tools/typename.h"
+
+namespace Aldermoor::Utilities::Tools {
+
+/// A `T` with an ordered list of children, each a tree of its own.
+///
+/// Ownership: children are shared.  A copy of a tree shares the children of its source and becomes
+/// their parent, so a child's parent is the node that was copied last.
+template <class T>
+class Tree : public T {
+ public:
+  using Children = std::list<SmartPointer<Tree<T>>>;
+
+  Tree() = default;
+  explicit Tree(const T& value) : T(value) {}
+
+  Tree(const Tree& other) try : T(other), children_(other.children_) { AdoptChildren(); }
+  ALDERMOOR_TEMPLATE_FRAME(Name() + "::Tree")
+
+  Tree& operator=(const Tree& other) try {
+    if (this != &other) {
+      T::operator=(other);
+      children_ = other.children_;
+      AdoptChildren();
+    }
+    return *this;
+  }
+  ALDERMOOR_TEMPLATE_FRAME(Name() + "::operator =")
+
+  virtual ~Tree() = default;
+
+  /// Appends a copy of `child`.
+  void AddChild(const Tree& child) try { AdoptChild(SmartPointer<Tree>(new Tree(child))); }
+  ALDERMOOR_TEMPLATE_FRAME(Name() + "::AddChild")
+
+  /// Appends `child` itself.
+  void AdoptChild(const SmartPointer<Tree>& child) {
+    child->parent_ = this;
+    children_.push_back(child);
+  }
+
+  const Children& GetChildren() const { return children_; }
+  bool HasChildren() const { return !children_.empty(); }
+  /// Null for a root.
+  const T* GetParent() const { return parent_; }
+
+ private:
+  static std::string Name() { return "Aldermoor::Utilities::Tools::Tree<" + TypeName<T>() + ">"; }
+
+  void AdoptChildren() {
+    for (const SmartPointer<Tree>& child : children_) {
+      child->parent_ = this;
+    }
+  }
+
+  Children children_;
+  const T* parent_ = nullptr;
+};
+
+}  // namespace Aldermoor::Utilities::Tools
+
+#endif  // ALDERMOOR_UTILITIES_TOOLS_TREE_H
