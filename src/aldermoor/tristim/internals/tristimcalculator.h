@@ -1,0 +1,91 @@
+#ifndef ALDERMOOR_TRISTIM_INTERNALS_TRISTIMCALCULATOR_H
+#define ALDERMOOR_TRISTIM_INTERNALS_TRISTIMCALCULATOR_H
+
+#include "aldermoor/tristim/hxcolorvector.h"
+#include "aldermoor/tristim/hxspectrum.h"
+#include "aldermoor/tristim/internals/basecalculator.h"
+
+namespace Aldermoor::Tristim::Internals {
+
+/// From a spectrum to tristimulus values and from there to every colour space.
+///
+/// White follows the illuminant and observer in the conditions of the spectrum or vector.  All
+/// operations return false if a step below them fails: no paper white for the white base "Paper",
+/// or a vector of another colour space than the operation reads.
+/// Shared state: TristimFilter::Get(), whose conditions change with almost every operation, and the
+/// paper white.  The formulas themselves are in colormath.h.
+class TristimCalculator : public BaseCalculator {
+ public:
+  /// The root of all that starts from a spectrum.  A spectrum measured as emission stays emission,
+  /// whatever illuminant is asked for.
+  [[nodiscard]] static bool GetVector_CIEXYZ(const HXSpectrum& spectrum,
+                                             const HXMeasureConditions& conditions,
+                                             HXColorVector& out);
+  [[nodiscard]] static bool GetVector_CIELab(const HXSpectrum& spectrum,
+                                             const HXMeasureConditions& conditions,
+                                             HXColorVector& out);
+  [[nodiscard]] static bool GetVector_CIELCh_ab(const HXSpectrum& spectrum,
+                                                const HXMeasureConditions& conditions,
+                                                HXColorVector& out);
+  [[nodiscard]] static bool GetVector_CIExyY(const HXSpectrum& spectrum,
+                                             const HXMeasureConditions& conditions,
+                                             HXColorVector& out);
+  /// L* with u' and v' themselves; for black the chromaticity of the light.
+  [[nodiscard]] static bool GetVector_CIELuv(const HXSpectrum& spectrum,
+                                             const HXMeasureConditions& conditions,
+                                             HXColorVector& out);
+  [[nodiscard]] static bool GetVector_CIELCh_uv(const HXSpectrum& spectrum,
+                                                const HXMeasureConditions& conditions,
+                                                HXColorVector& out);
+  [[nodiscard]] static bool GetVector_HunterLab(const HXSpectrum& spectrum,
+                                                const HXMeasureConditions& conditions,
+                                                HXColorVector& out);
+  [[nodiscard]] static bool GetVector_RxRyRz(const HXSpectrum& spectrum,
+                                             const HXMeasureConditions& conditions,
+                                             HXColorVector& out);
+  [[nodiscard]] static bool GetVector_LCHhx(const HXSpectrum& spectrum,
+                                            const HXMeasureConditions& conditions,
+                                            HXColorVector& out);
+  [[nodiscard]] static bool GetVector_LABhx(const HXSpectrum& spectrum,
+                                            const HXMeasureConditions& conditions,
+                                            HXColorVector& out);
+  [[nodiscard]] static bool GetVector_RGB(const HXSpectrum& spectrum,
+                                          const HXMeasureConditions& conditions,
+                                          HXColorVector& out);
+
+  [[nodiscard]] static bool GetVector_CIELab(const HXColorVector& xyz, HXColorVector& out);
+  [[nodiscard]] static bool GetVector_CIEXYZ(const HXColorVector& lab, HXColorVector& out);
+  /// Any rectangular triple to its polar one.
+  [[nodiscard]] static bool GetVector_CIELCh_ab(const HXColorVector& in, HXColorVector& out);
+  /// For black the chromaticity of the light.
+  [[nodiscard]] static bool GetVector_CIExyY(const HXColorVector& xyz, HXColorVector& out);
+  /// From "CIEXYZ" or "CIExyY"; false for any other.
+  [[nodiscard]] static bool GetVector_CIEuvY1976(const HXColorVector& in, HXColorVector& out);
+  [[nodiscard]] static bool GetVector_CIEuvY1960(const HXColorVector& in, HXColorVector& out);
+  /// Of the conditions of `out` only the colour space is set.
+  [[nodiscard]] static bool GetVector_CIELab_RGB(const HXColorVector& lab, HXColorVector& out);
+  /// The result is against D50, two-degree, absolute white, whatever the conditions of `rgb` say.
+  [[nodiscard]] static bool GetVector_RGB_CIEXYZ(const HXColorVector& rgb, HXColorVector& out);
+  [[nodiscard]] static bool GetVector_CMYK_RGB(const HXColorVector& cmyk, HXColorVector& out);
+
+  /// Differences of lightness, chroma and hue, first minus second.  The three are the same and
+  /// bear the names of the rectangular triples that they are meant for.
+  [[nodiscard]] static bool GetVector_DeltaCIELCH_ab(const HXColorVector& first,
+                                                     const HXColorVector& second,
+                                                     HXColorVector& out);
+  [[nodiscard]] static bool GetVector_CIELCH_uv(const HXColorVector& first,
+                                                const HXColorVector& second, HXColorVector& out);
+  [[nodiscard]] static bool GetVector_LCHhx_delta(const HXColorVector& first,
+                                                  const HXColorVector& second, HXColorVector& out);
+
+  /// The white point of `conditions`: Xn, 100, Zn.
+  [[nodiscard]] static bool GetNormValence(const HXMeasureConditions& conditions,
+                                           HXColorVector& out);
+
+  static double DegToRad(double degrees);
+  static double RadToDeg(double radians);
+};
+
+}  // namespace Aldermoor::Tristim::Internals
+
+#endif  // ALDERMOOR_TRISTIM_INTERNALS_TRISTIMCALCULATOR_H

@@ -1,0 +1,168 @@
+#include "aldermoor/tristim/tristimservice.h"
+
+#include "aldermoor/tristim/internals/tristimcalculator.h"
+#include "aldermoor/tristim/internals/vocabulary.h"
+#include "aldermoor/tristim/tristimexception.h"
+#include "aldermoor/utilities/exceptions/frame.h"
+
+namespace Aldermoor::Tristim {
+namespace {
+
+namespace Words = Vocabulary;
+using Calculator = Internals::TristimCalculator;
+
+constexpr char kCalculatorFailed[] = "TristimCalculator";
+constexpr char kNoColorSpace[] = "GetVector not supported for ColorSpace ";
+constexpr char kNoConversionFrom[] = "Conversion not supported from ColorSpace ";
+constexpr char kNoConversionTo[] = " to ColorSpace ";
+constexpr char kRgbFailed[] = "Conversion failed from RGB to XYZ";
+
+using FromSpectrum = bool (*)(const HXSpectrum& spectrum, const HXMeasureConditions& conditions,
+                              HXColorVector& out);
+using FromVector = bool (*)(const HXColorVector& in, HXColorVector& out);
+
+/// By way of XYZ, for the conversions that look at the type of what they are given.
+template <FromVector kFromXyz>
+bool ThroughXyz(const HXSpectrum& spectrum, const HXMeasureConditions& conditions,
+                HXColorVector& out) {
+  HXMeasureConditions as_xyz = conditions;
+  as_xyz.SetMeasureCondition(Words::kColorSpaceKey, Words::kCIEXYZ);
+  HXColorVector xyz;
+  return Calculator::GetVector_CIEXYZ(spectrum, as_xyz, xyz) && kFromXyz(xyz, out);
+}
+
+bool SpectrumToRgb(const HXSpectrum& spectrum, const HXMeasureConditions& conditions,
+                   HXColorVector& out) {
+  HXColorVector lab;
+  return Calculator::GetVector_CIELab(spectrum, conditions, lab) &&
+         Calculator::GetVector_CIELab_RGB(lab, out);
+}
+
+bool AnyToRgb(const HXColorVector& in, HXColorVector& out) {
+  return Calculator::GetVector_CIELab_RGB(TristimService::GetVector(in, Words::kCIELab), out);
+}
+
+bool RgbToLab(const HXColorVector& in, HXColorVector& out) {
+  HXColorVector xyz;
+  if (!Calculator::GetVector_RGB_CIEXYZ(in, xyz)) {
+    throw TristimException(kRgbFailed,
+                           ALDERMOOR_HERE(Aldermoor::Tristim::TristimService::GetVector));
+  }
+  out = TristimService::GetVector(xyz, Words::kCIELab);
+  return true;
+}
+
+struct SpectrumRow {
+  std::string_view color_space;
+  FromSpectrum run;
+};
+
+constexpr SpectrumRow kSpectrumRows[] = {
+    {Words::kCIELab, Calculator::GetVector_CIELab},
+    {Words::kCIELCh, Calculator::GetVector_CIELCh_ab},
+    {Words::kCIEXYZ, Calculator::GetVector_CIEXYZ},
+    {Words::kCIExyY, Calculator::GetVector_CIExyY},
+    {Words::kCIELChuv, Calculator::GetVector_CIELCh_uv},
+    {Words::kLABhx, Calculator::GetVector_LABhx},
+    {Words::kLCHhx, Calculator::GetVector_LCHhx},
+    {Words::kCIELuv, Calculator::GetVector_CIELuv},
+    {Words::kCIEuvY1976, ThroughXyz<Calculator::GetVector_CIEuvY1976>},
+    {Words::kCIEuvY1960, ThroughXyz<Calculator::GetVector_CIEuvY1960>},
+    {Words::kHunterLab, Calculator::GetVector_HunterLab},
+    {Words::kRxRyRz, Calculator::GetVector_RxRyRz},
+    {Words::kRGB, SpectrumToRgb},
+};
+
+/// An empty `from` stands for any.
+struct VectorRow {
+  std::string_view from;
+  std::string_view to;
+  FromVector run;
+};
+
+// The first row that fits runs, so the general way to RGB stands behind the special ones.
+constexpr VectorRow kVectorRows[] = {
+    {Words::kCIEXYZ, Words::kCIELab, Calculator::GetVector_CIELab},
+    {Words::kCIELab, Words::kCIEXYZ, Calculator::GetVector_CIEXYZ},
+    {Words::kCIELab, Words::kCIELCh, Calculator::GetVector_CIELCh_ab},
+    {Words::kLABhx, Words::kLCHhx, Calculator::GetVector_CIELCh_ab},
+    {Words::kCIELuv, Words::kCIELChuv, Calculator::GetVector_CIELCh_ab},
+    {Words::kCIEXYZ, Words::kCIExyY, Calculator::GetVector_CIExyY},
+    {Words::kCIELab, Words::kRGB, Calculator::GetVector_CIELab_RGB},
+    {Words::kCMYK, Words::kRGB, Calculator::GetVector_CMYK_RGB},
+    {"", Words::kRGB, AnyToRgb},
+    {Words::kCIEXYZ, Words::kCIEuvY1960, Calculator::GetVector_CIEuvY1960},
+    {Words::kCIExyY, Words::kCIEuvY1960, Calculator::GetVector_CIEuvY1960},
+    {Words::kCIEXYZ, Words::kCIEuvY1976, Calculator::GetVector_CIEuvY1976},
+    {Words::kCIExyY, Words::kCIEuvY1976, Calculator::GetVector_CIEuvY1976},
+    {Words::kRGB, Words::kCIELab, RgbToLab},
+};
+
+FromSpectrum FindWay(std::string_view color_space) {
+  for (const SpectrumRow& row : kSpectrumRows) {
+    if (row.color_space == color_space) {
+      return row.run;
+    }
+  }
+  return nullptr;
+}
+
+FromVector FindWay(std::string_view from, std::string_view to) {
+  for (const VectorRow& row : kVectorRows) {
+    if ((row.from.empty() || row.from == from) && row.to == to) {
+      return row.run;
+    }
+  }
+  return nullptr;
+}
+
+}  // namespace
+
+HXColorVector TristimService::GetVector(const HXSpectrum& spectrum,
+                                        const HXMeasureConditions& conditions) try {
+  const FromSpectrum run = FindWay(conditions.GetColorSpace());
+  if (run == nullptr) {
+    throw TristimException(kNoColorSpace + conditions.GetColorSpace(),
+                           ALDERMOOR_HERE(Aldermoor::Tristim::TristimService::GetVector));
+  }
+  HXColorVector out;
+  if (!run(spectrum, conditions, out)) {
+    throw TristimException(kCalculatorFailed,
+                           ALDERMOOR_HERE(Aldermoor::Tristim::TristimService::GetVector));
+  }
+  return out;
+}
+ALDERMOOR_FRAME(Aldermoor::Tristim::TristimService::GetVector)
+
+HXColorVector TristimService::GetVector(const HXColorVector& vector,
+                                        const std::string& colorSpace) try {
+  const std::string& from = vector.GetMeasureConditions().GetColorSpace();
+  if (from == colorSpace) {
+    return vector;
+  }
+  const FromVector run = FindWay(from, colorSpace);
+  if (run == nullptr) {
+    throw TristimException(kNoConversionFrom + from + kNoConversionTo + colorSpace,
+                           ALDERMOOR_HERE(Aldermoor::Tristim::TristimService::GetVector));
+  }
+  HXColorVector out;
+  if (!run(vector, out)) {
+    throw TristimException(kCalculatorFailed,
+                           ALDERMOOR_HERE(Aldermoor::Tristim::TristimService::GetVector));
+  }
+  if (colorSpace == Words::kRGB) {
+    return out;
+  }
+  // Three channels, and the conditions of the source even where the way led through others.
+  HXMeasureConditions conditions = vector.GetMeasureConditions();
+  conditions.SetMeasureCondition(Words::kColorSpaceKey, colorSpace);
+  return {out[0], out[1], out[2], conditions};
+}
+ALDERMOOR_FRAME(Aldermoor::Tristim::TristimService::GetVector)
+
+const std::vector<std::string>& TristimService::GetSupportedValues(std::string_view key) try {
+  return HXMeasureConditions::GetSupportedValues(key);
+}
+ALDERMOOR_FRAME(Aldermoor::Tristim::TristimService::GetSupportedValues)
+
+}  // namespace Aldermoor::Tristim

@@ -1,0 +1,132 @@
+#include <bit>
+#include <cmath>
+#include <cstdint>
+
+#include <gtest/gtest.h>
+
+#include "aldermoor/tristim/internals/tristimcalculator.h"
+#include "aldermoor/tristim/tristimservice.h"
+
+#include "tests/tristim/support.h"
+
+// Every compiler and every level of optimisation has to give the same bits.  The checksums below
+// are over all channels of all results; they change only when a formula, a table or an order of
+// summation changes.
+namespace Aldermoor::Tristim::Tests {
+namespace {
+
+using Internals::TristimCalculator;
+
+/// Linear congruential generator of Numerical Recipes; the same numbers everywhere.
+class Lcg {
+ public:
+  /// 0 to below 1, in steps of 2^-16.
+  float Next() {
+    state_ = state_ * 1664525U + 1013904223U;
+    return static_cast<float>(state_ >> 16) / 65536.0F;
+  }
+  float Next(float low, float high) { return low + (high - low) * Next(); }
+
+ private:
+  std::uint32_t state_ = 20260101U;
+};
+
+/// FNV-1a, 64 bit, over the bit patterns of floats, lowest byte first.
+class Checksum {
+ public:
+  void Add(const HXColorVector& vector) {
+    for (const float value : vector.GetChannels()) {
+      // The sign of a NaN is the compiler's choice, so none may come up.
+      ASSERT_FALSE(std::isnan(value));
+      const auto bits = std::bit_cast<std::uint32_t>(value);
+      for (unsigned shift = 0; shift < 32; shift += 8) {
+        hash_ = (hash_ ^ ((bits >> shift) & 0xFFU)) * 1099511628211ULL;
+      }
+    }
+    ++count_;
+  }
+  std::uint64_t Get() const { return hash_; }
+  int Count() const { return count_; }
+
+ private:
+  std::uint64_t hash_ = 14695981039346656037ULL;
+  int count_ = 0;
+};
+
+std::vector<HXMeasureConditions> AllLights(Lcg& random) {
+  std::vector<HXMeasureConditions> lights;
+  for (const char* const observer : {"TwoDegree", "TenDegree"}) {
+    for (const char* const word :
+         {"A", "B", "C", "D50", "D55", "D65", "D75", "Emission", "Dxx, Temperature:4000",
+          "Dxx, Temperature:6996", "Dxx, Temperature:6997", "Dxx, Temperature:25000"}) {
+      lights.push_back(Conditions(word, observer));
+    }
+    for (int number = 1; number <= 12; ++number) {
+      lights.push_back(Conditions(std::string("F").append(std::to_string(number)) + " ", observer));
+    }
+    HXSpectrum curve;
+    for (unsigned i = 0; i < HXSpectrum::kBands; ++i) {
+      curve[i] = random.Next(10.0F, 100.0F);
+    }
+    lights.push_back(Conditions("D65", observer));
+    lights.back().SetUserdefinedIllumination(curve);
+  }
+  return lights;
+}
+
+TEST(BitsTest, OfAllColorSpacesFromSpectra) {
+  Lcg random;
+  Checksum checksum;
+  for (HXMeasureConditions light : AllLights(random)) {
+    for (int round = 0; round < 20; ++round) {
+      HXSpectrum spectrum;
+      const float level = random.Next();
+      for (unsigned i = 0; i < HXSpectrum::kBands; ++i) {
+        spectrum[i] = level * random.Next() + 0.001F;
+      }
+      for (const char* const space :
+           {"CIELab", "CIELCh", "CIEXYZ", "CIExyY", "CIELuv", "CIELChuv", "CIEuvY1976",
+            "CIEuvY1960", "HunterLab", "RxRyRz", "LABhx", "LCHhx", "RGB"}) {
+        light.SetMeasureCondition(Vocabulary::kColorSpaceKey, space);
+        checksum.Add(TristimService::GetVector(spectrum, light));
+      }
+    }
+  }
+  EXPECT_EQ(checksum.Count(), 50 * 20 * 13);
+  EXPECT_EQ(checksum.Get(), 0x9C0560E1D4F8E71ULL);
+}
+
+TEST(BitsTest, OfAllConversionsOfVectors) {
+  Lcg random;
+  Checksum checksum;
+  constexpr std::pair<const char*, const char*> kRows[] = {
+      {"CIEXYZ", "CIELab"},     {"CIELab", "CIEXYZ"},     {"CIELab", "CIELCh"},
+      {"LABhx", "LCHhx"},       {"CIELuv", "CIELChuv"},   {"CIEXYZ", "CIExyY"},
+      {"CIELab", "RGB"},        {"CMYK", "RGB"},          {"CIEXYZ", "RGB"},
+      {"CIEXYZ", "CIEuvY1960"}, {"CIExyY", "CIEuvY1960"}, {"CIEXYZ", "CIEuvY1976"},
+      {"CIExyY", "CIEuvY1976"}, {"RGB", "CIELab"}};
+  for (const HXMeasureConditions& light : AllLights(random)) {
+    for (const auto& [from, to] : kRows) {
+      HXMeasureConditions conditions = light;
+      conditions.SetMeasureCondition(Vocabulary::kColorSpaceKey, from);
+      for (int round = 0; round < 20; ++round) {
+        const bool rectangular = std::string_view(from).ends_with("Lab") || from[0] == 'L';
+        HXColorVector vector(
+            {random.Next(0.0F, 100.0F), random.Next(rectangular ? -80.0F : 0.0F, 100.0F),
+             random.Next(rectangular ? -80.0F : 0.0F, 100.0F), 0.0F},
+            conditions);
+        vector[3] = from[0] == 'C' && from[1] == 'M' ? random.Next(0.0F, 100.0F) : 0.0F;
+        checksum.Add(TristimService::GetVector(vector, to));
+        HXColorVector delta;
+        ASSERT_TRUE(TristimCalculator::GetVector_DeltaCIELCH_ab(
+            vector, HXColorVector(50.0F, 10.0F, -5.0F, conditions), delta));
+        checksum.Add(delta);
+      }
+    }
+  }
+  EXPECT_EQ(checksum.Count(), 50 * 14 * 20 * 2);
+  EXPECT_EQ(checksum.Get(), 0xFEFDD023194A4D2BULL);
+}
+
+}  // namespace
+}  // namespace Aldermoor::Tristim::Tests
