@@ -1,0 +1,164 @@
+#include "aldermoor/vexdoc/colorimetrybridge.h"
+
+#include <array>
+#include <stdexcept>
+#include <string>
+#include <vector>
+
+#include "aldermoor/tristim/hxcolorvector.h"
+#include "aldermoor/tristim/hxmeasureconditions.h"
+#include "aldermoor/tristim/hxspectrum.h"
+#include "aldermoor/tristim/internals/vocabulary.h"
+#include "aldermoor/tristim/tristimexception.h"
+#include "aldermoor/tristim/tristimservice.h"
+#include "aldermoor/utilities/exceptions/exceptions.h"
+#include "aldermoor/utilities/exceptions/frame.h"
+
+namespace Aldermoor::Vexdoc {
+
+using Tristim::HXColorVector;
+using Tristim::HXMeasureConditions;
+using Tristim::HXSpectrum;
+using Tristim::TristimException;
+using Tristim::TristimService;
+using Utilities::Exceptions::ResourceNotAvailableException;
+using Utilities::Tools::SmartPointer;
+
+namespace {
+
+using Tristim::Vocabulary::kUndefined;
+using Tristim::Vocabulary::kUserdefined;
+
+const std::string kIlluminationKey = Tristim::Vocabulary::kIlluminationKey;
+const std::string kColorSpaceKey = Tristim::Vocabulary::kColorSpaceKey;
+
+// What a computed attribute says about itself.
+const std::array<std::string, 13> kCarriedKeys = {
+    Tristim::Vocabulary::kFilterKey,
+    Tristim::Vocabulary::kNumberOfDataPointsKey,
+    Tristim::Vocabulary::kWavelengthMinKey,
+    Tristim::Vocabulary::kWavelengthMaxKey,
+    Tristim::Vocabulary::kObserverKey,
+    kIlluminationKey,
+    Tristim::Vocabulary::kWhiteBaseKey,
+    Tristim::Vocabulary::kDensityStandardKey,
+    Tristim::Vocabulary::kDensityFilterModeKey,
+    kColorSpaceKey,
+    Tristim::Vocabulary::kVectorKindKey,
+    Tristim::Vocabulary::kDeltaEFormulaKey,
+    Tristim::Vocabulary::kSpectrumTypeKey,
+};
+
+SmartPointer<SampleAttribute> Derived(const HXColorVector& vector) {
+  SmartPointer<SampleAttribute> result = ToColorVector(vector);
+  result->SetDerived(true);
+  return result;
+}
+
+}  // namespace
+
+bool IsKnownColorSpace(const std::string& color_space) try {
+  try {
+    HXMeasureConditions().SetMeasureCondition(kColorSpaceKey, color_space);
+    return true;
+  } catch (const TristimException&) {
+    return false;
+  }
+}
+ALDERMOOR_FRAME(Aldermoor::Vexdoc::IsKnownColorSpace)
+
+const std::vector<std::string>& GetChannelLabels(const std::string& color_space) try {
+  HXMeasureConditions().SetMeasureCondition(kColorSpaceKey, color_space);
+  return HXMeasureConditions::GetSupportedValues(Tristim::Vocabulary::kChannelLabelsPrefix +
+                                                 color_space);
+}
+ALDERMOOR_FRAME(Aldermoor::Vexdoc::GetChannelLabels)
+
+HXMeasureConditions ToMeasureConditions(const Conditions& conditions) try {
+  HXMeasureConditions result;
+  for (const auto& [key, value] : conditions.GetAttributes()) {
+    try {
+      result.SetMeasureCondition(key, value);
+      if (conditions.HasCustomIllumination() && key == kIlluminationKey && value == kUserdefined) {
+        result.SetUserdefinedIllumination(ToHXSpectrum(conditions.GetCustomIllumination()));
+      }
+    } catch (const TristimException&) {
+      // Documents hold keys and words of their own; colorimetry keeps its default for them.
+    }
+  }
+  return result;
+}
+ALDERMOOR_FRAME(Aldermoor::Vexdoc::ToMeasureConditions)
+
+Conditions ToConditions(const HXMeasureConditions& conditions) try {
+  Conditions result;
+  for (const std::string& key : kCarriedKeys) {
+    const std::string value = conditions.GetMeasureCondition(key);
+    if (value == kUndefined) {
+      continue;
+    }
+    result.AddAttribute(key, value);
+    if (value == kUserdefined && key == kIlluminationKey) {
+      result.SetCustomIllumination(ToSpectrum(conditions.GetUserdefinedIllumination()));
+    }
+  }
+  return result;
+}
+ALDERMOOR_FRAME(Aldermoor::Vexdoc::ToConditions)
+
+HXSpectrum ToHXSpectrum(const Spectrum& spectrum) try {
+  return HXSpectrum(spectrum.GetData(), ToMeasureConditions(*spectrum.GetConditions()));
+}
+ALDERMOOR_FRAME(Aldermoor::Vexdoc::ToHXSpectrum)
+
+Spectrum ToSpectrum(const HXSpectrum& spectrum) try {
+  return Spectrum(ToConditions(spectrum.GetMeasureConditions()), spectrum.GetValues());
+}
+ALDERMOOR_FRAME(Aldermoor::Vexdoc::ToSpectrum)
+
+SmartPointer<ColorVector> ToColorVector(const HXColorVector& vector) try {
+  const HXMeasureConditions& conditions = vector.GetMeasureConditions();
+  const std::string color_space = conditions.GetMeasureCondition(kColorSpaceKey);
+  if (color_space == kUndefined) {
+    throw std::invalid_argument("Colorspace missing");
+  }
+  const short count = color_space == Tristim::Vocabulary::kCMYK ? 4 : 3;
+  std::vector<float> values;
+  for (short i = 0; i < count; ++i) {
+    values.push_back(vector[i]);
+  }
+  return SmartPointer<ColorVector>(new ColorVector(ToConditions(conditions), values));
+}
+ALDERMOOR_FRAME(Aldermoor::Vexdoc::ToColorVector)
+
+SmartPointer<SampleAttribute> ComputeColorVector(const Spectrum& spectrum,
+                                                 const Conditions& conditions) try {
+  try {
+    const HXMeasureConditions target = ToMeasureConditions(conditions);
+    return Derived(TristimService::GetVector(ToHXSpectrum(spectrum), target));
+  } catch (const TristimException&) {
+    return {};
+  }
+}
+ALDERMOOR_FRAME(Aldermoor::Vexdoc::ComputeColorVector)
+
+SmartPointer<SampleAttribute> ComputeColorVector(const ColorScheme::Channels& channels,
+                                                 const Conditions& own,
+                                                 const Conditions& target) try {
+  try {
+    std::vector<float> values;
+    for (const auto& channel : channels) {
+      values.push_back(channel.second);
+    }
+    const HXColorVector source(values, ToMeasureConditions(own));
+    const std::string color_space = target.GetAttribute(kColorSpaceKey);
+    return Derived(TristimService::GetVector(source, color_space));
+  } catch (const TristimException&) {
+    return {};
+  } catch (const ResourceNotAvailableException&) {
+    return {};
+  }
+}
+ALDERMOOR_FRAME(Aldermoor::Vexdoc::ComputeColorVector)
+
+}  // namespace Aldermoor::Vexdoc

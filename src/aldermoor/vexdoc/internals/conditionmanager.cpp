@@ -1,0 +1,135 @@
+#include "aldermoor/vexdoc/internals/conditionmanager.h"
+
+#include <functional>
+
+#include "aldermoor/utilities/exceptions/exceptions.h"
+#include "aldermoor/utilities/exceptions/frame.h"
+#include "aldermoor/vexdoc/spectrum.h"
+
+namespace Aldermoor::Vexdoc::Internals {
+
+using Utilities::Exceptions::Filled;
+using Utilities::Exceptions::ResourceNotAvailableException;
+
+namespace {
+
+// A walk over fewer blocks costs less than a hash of the attributes.
+constexpr std::size_t kFewBlocks = 16;
+
+std::size_t HashOf(const Conditions& conditions) {
+  std::size_t hash = 0;
+  for (const auto& [key, value] : conditions.GetAttributes()) {
+    const std::hash<std::string> text;
+    hash = (hash * 31 + text(key)) * 31 + text(value);
+  }
+  return hash;
+}
+
+}  // namespace
+
+ConditionManager::Block ConditionManager::AddConditions(const Conditions& conditions) try {
+  const std::string id = GetNextUniqueID();
+  const Block block(new Conditions(id, conditions));
+  block->is_shared_ = true;
+  const auto entry = conditions_.emplace(id, block).first;
+  if (!is_index_stale_) {
+    is_index_stale_ = true;  // should the next line fail
+    index_.emplace(HashOf(*block), entry);
+    is_index_stale_ = false;
+  }
+  return block;
+}
+ALDERMOOR_FRAME(Aldermoor::Vexdoc::Internals::ConditionManager::AddConditions)
+
+ConditionManager::Block ConditionManager::GetOrCreateConditions(const Conditions& conditions) try {
+  const Block block = FindEqual(conditions);
+  return block ? block : AddConditions(conditions);
+}
+ALDERMOOR_FRAME(Aldermoor::Vexdoc::Internals::ConditionManager::GetOrCreateConditions)
+
+ConditionManager::Block ConditionManager::FindEqual(const Conditions& conditions) {
+  if (conditions_.size() <= kFewBlocks) {
+    for (const auto& [id, block] : conditions_) {
+      if (*block == conditions) {
+        return block;
+      }
+    }
+    return {};
+  }
+  // A file with very many blocks must not cost the square of their number.
+  UpdateIndex();
+  auto first = conditions_.cend();
+  const auto [begin, end] = index_.equal_range(HashOf(conditions));
+  for (auto candidate = begin; candidate != end; ++candidate) {
+    const auto entry = candidate->second;
+    if (*entry->second == conditions &&
+        (first == conditions_.cend() || entry->first < first->first)) {
+      first = entry;
+    }
+  }
+  return first == conditions_.cend() ? Block() : first->second;
+}
+
+// Applications may change a shared block; the index then is made anew.
+void ConditionManager::UpdateIndex() {
+  if (!is_index_stale_ && indexed_changes_ == Conditions::changes_of_shared_) {
+    return;
+  }
+  is_index_stale_ = true;
+  index_.clear();
+  for (auto entry = conditions_.cbegin(); entry != conditions_.cend(); ++entry) {
+    index_.emplace(HashOf(*entry->second), entry);
+  }
+  indexed_changes_ = Conditions::changes_of_shared_;
+  is_index_stale_ = false;
+}
+
+void ConditionManager::DropIndex() {
+  index_.clear();
+  is_index_stale_ = true;
+}
+
+ConditionManager::Block ConditionManager::GetConditions(const std::string& id) try {
+  const auto entry = conditions_.find(id);
+  if (entry == conditions_.end()) {
+    throw ResourceNotAvailableException(Filled("Condition(ID=<%NAME%>) not found", "%NAME%", id),
+                                        "");
+  }
+  return entry->second;
+}
+ALDERMOOR_FRAME(Aldermoor::Vexdoc::Internals::ConditionManager::GetConditions)
+
+ConditionManager::Block ConditionManager::NewConditions() try {
+  return AddConditions(Conditions());
+}
+ALDERMOOR_FRAME(Aldermoor::Vexdoc::Internals::ConditionManager::NewConditions)
+
+void ConditionManager::RemoveConditions(const std::string& id) try {
+  DropIndex();
+  conditions_.erase(id);
+}
+ALDERMOOR_FRAME(Aldermoor::Vexdoc::Internals::ConditionManager::RemoveConditions)
+
+void ConditionManager::RemoveAllConditions(bool onlyUnused) try {
+  DropIndex();
+  if (!onlyUnused) {
+    conditions_.clear();
+    return;
+  }
+  // A block may hold an illuminant whose own block becomes unused with it, so the walk begins
+  // again until nothing was removed.
+  while (std::erase_if(conditions_,
+                       [](const auto& entry) { return entry.second.UseCount() == 1; }) != 0) {
+  }
+}
+ALDERMOOR_FRAME(Aldermoor::Vexdoc::Internals::ConditionManager::RemoveAllConditions)
+
+unsigned long ConditionManager::GetConditionsCount() {
+  return conditions_.size();
+}
+
+std::string ConditionManager::GetNextUniqueID() {
+  return std::to_string(++next_id_);
+}
+
+}  // namespace Aldermoor::Vexdoc::Internals

@@ -1,0 +1,132 @@
+#include "aldermoor/vexdoc/internals/xercesadapter.h"
+
+#include <array>
+#include <istream>
+#include <vector>
+
+#include <xercesc/dom/DOMDocument.hpp>
+#include <xercesc/framework/LocalFileInputSource.hpp>
+#include <xercesc/framework/MemBufInputSource.hpp>
+#include <xercesc/util/PlatformUtils.hpp>
+#include <xercesc/util/XMLException.hpp>
+
+#include "aldermoor/utilities/exceptions/exceptions.h"
+#include "aldermoor/utilities/exceptions/frame.h"
+#include "aldermoor/vexdoc/internals/documentaccess.h"
+#include "aldermoor/vexdoc/internals/documentparser.h"
+#include "aldermoor/vexdoc/internals/xerceshelper.h"
+#include "aldermoor/vexdoc/vexexception.h"
+
+namespace Aldermoor::Vexdoc::Internals {
+
+using Utilities::Exceptions::Filled;
+using Utilities::Exceptions::ResourceNotAvailableException;
+using Utilities::FileSystem::File;
+using Utilities::Tools::SmartPointer;
+using xercesc::XMLException;
+using xercesc::XMLPlatformUtils;
+
+namespace {
+
+constexpr const char* kStreamName = "VEX";
+
+void CheckPlatform() {
+  if (XMLPlatformUtils::fgMemoryManager == nullptr) {
+    throw VexException("The XML platform is not initialised",
+                       ALDERMOOR_HERE(Aldermoor::Vexdoc::Internals::XercesAdapter::Load));
+  }
+}
+
+std::string StreamFailure(const VexException& e) {
+  return Filled("An error occurred during parsing a Stream:\n%REASON%", "%REASON%", e.what());
+}
+
+std::vector<char> ReadAll(std::istream& in) {
+  in.unsetf(std::ios_base::skipws);
+  std::vector<char> bytes;
+  std::array<char, 65536> chunk;
+  do {
+    in.read(chunk.data(), static_cast<std::streamsize>(chunk.size()));
+    bytes.insert(bytes.end(), chunk.data(), chunk.data() + in.gcount());
+  } while (in);
+  return bytes;
+}
+
+}  // namespace
+
+XercesAdapter::XercesAdapter(VEX* document) : document_(document) {}
+
+void XercesAdapter::Load(std::istream& in) try {
+  CheckPlatform();
+  try {
+    const std::vector<char> bytes = ReadAll(in);
+    const xercesc::MemBufInputSource source(reinterpret_cast<const XMLByte*>(bytes.data()),
+                                            bytes.size(), kStreamName, false,
+                                            XMLPlatformUtils::fgMemoryManager);
+    LoadFrom(source);
+  } catch (const XMLException& e) {
+    throw VexException(
+        Filled("An internal XML exception has occured while initializing XML:\n%REASON%",
+               "%REASON%", ToNativeString(e.getMessage())),
+        ALDERMOOR_HERE(Aldermoor::Vexdoc::Internals::XercesAdapter::Load));
+  } catch (const VexXMLParseException& e) {
+    // Still a VexException to who asks for one, but with the place of the fault.
+    throw VexXMLParseException(StreamFailure(e), e.GetFile(), e.GetLine(), e.GetColumn(),
+                               ALDERMOOR_HERE(Aldermoor::Vexdoc::Internals::XercesAdapter::Load));
+  } catch (const VexException& e) {
+    throw VexException(StreamFailure(e),
+                       ALDERMOOR_HERE(Aldermoor::Vexdoc::Internals::XercesAdapter::Load));
+  }
+}
+ALDERMOOR_FRAME(Aldermoor::Vexdoc::Internals::XercesAdapter::Load)
+
+void XercesAdapter::Load(File& file) try {
+  CheckPlatform();
+  const std::string path = file.GetAbsolutePlatformName();
+  if (!file.IsAccessable(false)) {
+    throw ResourceNotAvailableException(
+        "file '" + path + "' not accessable ",
+        ALDERMOOR_HERE(Aldermoor::Vexdoc::Internals::XercesAdapter::Load));
+  }
+  try {
+    const xercesc::LocalFileInputSource source(XMLChBuffer(path).Get(),
+                                               XMLPlatformUtils::fgMemoryManager);
+    LoadFrom(source);
+  } catch (const XMLException& e) {
+    throw VexException(
+        Filled("An internal XML exception has occurred while loading XML:\n'%REASON%'", "%REASON%",
+               ToNativeString(e.getMessage())),
+        ALDERMOOR_HERE(Aldermoor::Vexdoc::Internals::XercesAdapter::Load));
+  }
+}
+ALDERMOOR_FRAME(Aldermoor::Vexdoc::Internals::XercesAdapter::Load)
+
+SmartPointer<XMLLoader> XercesAdapter::GetLoader(xercesc::DOMDocument* document) try {
+  const NodeHolder holder(document);
+  std::string name = "Version";
+  std::string version;
+  holder.FindChild("VEX", true).GetAttribute(name, version);
+  if (version.empty()) {
+    throw VexException(
+        "The root element has no \"Version\": documents of the legacy dialect "
+        "are not read",
+        ALDERMOOR_HERE(Aldermoor::Vexdoc::Internals::XercesAdapter::GetLoader));
+  }
+  return SmartPointer<XMLLoader>(new XMLLoader(holder));
+}
+ALDERMOOR_FRAME(Aldermoor::Vexdoc::Internals::XercesAdapter::GetLoader)
+
+void XercesAdapter::LoadFrom(const xercesc::InputSource& source) {
+  DocumentParser parser;
+  try {
+    parser.parse(source);
+  } catch (const VexException&) {
+    parser.resetDocumentPool();
+    parser.setValidationScheme(xercesc::XercesDOMParser::Val_Never);
+    parser.parse(source);
+  }
+  const SmartPointer<VEX> loaded = GetLoader(parser.getDocument())->Load();
+  DocumentAccess::Swap(*document_, *loaded);
+}
+
+}  // namespace Aldermoor::Vexdoc::Internals

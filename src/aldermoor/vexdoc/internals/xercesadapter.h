@@ -1,0 +1,45 @@
+#ifndef ALDERMOOR_VEXDOC_INTERNALS_XERCESADAPTER_H
+#define ALDERMOOR_VEXDOC_INTERNALS_XERCESADAPTER_H
+
+#include <xercesc/util/XercesDefs.hpp>
+
+#include "aldermoor/utilities/tools/smartpointer.h"
+#include "aldermoor/vexdoc/internals/xmlloader.h"
+#include "aldermoor/vexdoc/internals/xmlparseradapter.h"
+#include "aldermoor/vexdoc/vex.h"
+
+XERCES_CPP_NAMESPACE_BEGIN
+class DOMDocument;
+class InputSource;
+XERCES_CPP_NAMESPACE_END
+
+namespace Aldermoor::Vexdoc::Internals {
+
+/// The adapter on Xerces-C++.  A load builds a new document, and only a finished one replaces the
+/// content of the document served.
+///
+/// A text that fails is parsed a second time without validation, so that a file loads which only
+/// breaks the DTD that it names; external DTDs and entities are never opened.
+class XercesAdapter : public XMLParserAdapter {
+ public:
+  /// `document` is not owned.
+  explicit XercesAdapter(VEX* document);
+
+  /// Throws: VexException with the failure's text.
+  void Load(std::istream& in) override;
+  /// Throws: ResourceNotAvailableException for a file that cannot be read; else what the parse and
+  /// the loader throw.
+  void Load(Utilities::FileSystem::File& file) override;
+
+  /// The loader for the dialect of a parsed document, which its root's "Version" tells.
+  static Utilities::Tools::SmartPointer<XMLLoader> GetLoader(xercesc::DOMDocument* document);
+
+ private:
+  void LoadFrom(const xercesc::InputSource& source);
+
+  VEX* document_;
+};
+
+}  // namespace Aldermoor::Vexdoc::Internals
+
+#endif  // ALDERMOOR_VEXDOC_INTERNALS_XERCESADAPTER_H

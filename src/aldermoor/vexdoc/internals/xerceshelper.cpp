@@ -1,0 +1,102 @@
+#include "aldermoor/vexdoc/internals/xerceshelper.h"
+
+#include <array>
+#include <charconv>
+#include <sstream>
+#include <system_error>
+
+#include <xercesc/util/PlatformUtils.hpp>
+#include <xercesc/util/XMLString.hpp>
+
+#include "aldermoor/utilities/tools/lexicalcast.h"
+
+namespace Aldermoor::Vexdoc::Internals {
+
+using xercesc::XMLPlatformUtils;
+using xercesc::XMLString;
+
+namespace {
+
+bool IsSpace(XMLCh c) {
+  return c == u' ' || (c >= u'\t' && c <= u'\r');
+}
+
+bool IsDigit(XMLCh c) {
+  return c >= u'0' && c <= u'9';
+}
+
+bool IsPartOfNumber(XMLCh c) {
+  return IsDigit(c) || c == u'.' || c == u'-' || c == u'+' || c == u'e' || c == u'E';
+}
+
+}  // namespace
+
+XMLChBuffer::XMLChBuffer(const char* text)
+    : text_(XMLString::transcode(text, XMLPlatformUtils::fgMemoryManager)) {}
+
+XMLChBuffer::~XMLChBuffer() {
+  XMLString::release(&text_, XMLPlatformUtils::fgMemoryManager);
+}
+
+NativeBuffer::NativeBuffer(const XMLCh* text)
+    : text_(XMLString::transcode(text, XMLPlatformUtils::fgMemoryManager)) {}
+
+NativeBuffer::~NativeBuffer() {
+  XMLString::release(&text_, XMLPlatformUtils::fgMemoryManager);
+}
+
+std::string ToNativeString(const XMLCh* text) {
+  if (text == nullptr) {
+    return "";
+  }
+  // Nearly all text is ASCII, which is the same in both; the rest goes through the transcoder.
+  std::string native;
+  for (const XMLCh* c = text; *c != 0; ++c) {
+    if (*c > 0x7F) {
+      return NativeBuffer(text).Get();
+    }
+    native.push_back(static_cast<char>(*c));
+  }
+  return native;
+}
+
+float ReadFloat(const XMLCh* text) {
+  const XMLCh* c = text;
+  while (IsSpace(*c)) {
+    ++c;
+  }
+  // The common forms without a stream; whatever is unusual about a number is left to one.
+  std::array<char, 32> number{};
+  std::size_t length = 0;
+  for (; length < number.size() && IsPartOfNumber(*c); ++c) {
+    number[length++] = static_cast<char>(*c);
+  }
+  if (length > 0 && (*c == 0 || IsSpace(*c))) {
+    float value = 0.0F;
+    const char* const end = number.data() + length;
+    const auto [stopped, error] = std::from_chars(number.data(), end, value);
+    if (error == std::errc() && stopped == end) {
+      return value;
+    }
+  }
+  std::istringstream stream(ToNativeString(text));
+  float value = 0.0F;
+  stream >> value;
+  return value;
+}
+
+unsigned int ReadUnsigned(const XMLCh* text) {
+  constexpr int kDigitsThatFit = 9;
+  unsigned int value = 0;
+  int digits = 0;
+  while (digits < kDigitsThatFit && IsDigit(text[digits])) {
+    value = value * 10 + static_cast<unsigned int>(text[digits] - u'0');
+    ++digits;
+  }
+  if (digits > 0 && text[digits] == 0) {
+    return value;
+  }
+  return Utilities::Tools::lexical_cast<unsigned int>(ToNativeString(text));
+}
+
+}  // namespace Aldermoor::Vexdoc::Internals

@@ -1,0 +1,53 @@
+#ifndef ALDERMOOR_VEXDOC_INTERNALS_XERCESHELPER_H
+#define ALDERMOOR_VEXDOC_INTERNALS_XERCESHELPER_H
+
+#include <string>
+
+#include <xercesc/util/XercesDefs.hpp>
+
+namespace Aldermoor::Vexdoc::Internals {
+
+/// A string in the parser's characters, made from one of the model's and freed with this object.
+class XMLChBuffer {
+ public:
+  explicit XMLChBuffer(const char* text);
+  explicit XMLChBuffer(const std::string& text) : XMLChBuffer(text.c_str()) {}
+  XMLChBuffer(const XMLChBuffer&) = delete;
+  XMLChBuffer& operator=(const XMLChBuffer&) = delete;
+  ~XMLChBuffer();
+
+  const XMLCh* Get() const { return text_; }
+
+ private:
+  XMLCh* text_;
+};
+
+/// A string of the model, made from one in the parser's characters and freed with this object.
+class NativeBuffer {
+ public:
+  explicit NativeBuffer(const XMLCh* text);
+  NativeBuffer(const NativeBuffer&) = delete;
+  NativeBuffer& operator=(const NativeBuffer&) = delete;
+  ~NativeBuffer();
+
+  std::string Get() const { return text_ == nullptr ? "" : text_; }
+
+ private:
+  char* text_;
+};
+
+/// A string of the model from the parser's characters; empty for null.
+std::string ToNativeString(const XMLCh* text);
+
+/// The float at the beginning of a text as a stream reads it: leading white space is skipped, text
+/// behind the number is ignored, text without one gives 0, a number beyond the range of a float
+/// gives the greatest float.
+float ReadFloat(const XMLCh* text);
+
+/// The whole number at the beginning of a text.
+/// Throws: std::invalid_argument if there is none, or it does not fit.
+unsigned int ReadUnsigned(const XMLCh* text);
+
+}  // namespace Aldermoor::Vexdoc::Internals
+
+#endif  // ALDERMOOR_VEXDOC_INTERNALS_XERCESHELPER_H

@@ -1,0 +1,309 @@
+#include "aldermoor/vexdoc/internals/xmlloader.h"
+
+#include <algorithm>
+#include <array>
+#include <utility>
+
+#include <xercesc/util/XMLString.hpp>
+
+#include "aldermoor/utilities/exceptions/frame.h"
+#include "aldermoor/utilities/tools/lexicalcast.h"
+#include "aldermoor/vexdoc/colorvector.h"
+#include "aldermoor/vexdoc/conditionkeys.h"
+#include "aldermoor/vexdoc/internals/conditionmanager.h"
+#include "aldermoor/vexdoc/internals/documentaccess.h"
+#include "aldermoor/vexdoc/internals/elementfactory.h"
+#include "aldermoor/vexdoc/internals/xerceshelper.h"
+#include "aldermoor/vexdoc/recipe.h"
+#include "aldermoor/vexdoc/spectrum.h"
+#include "aldermoor/vexdoc/unknownsampleattribute.h"
+#include "aldermoor/vexdoc/vexexception.h"
+
+namespace Aldermoor::Vexdoc::Internals {
+
+using Utilities::Tools::DynamicCast;
+using Utilities::Tools::SmartPointer;
+using xercesc::DOMNode;
+using xercesc::XMLString;
+
+namespace {
+
+constexpr XMLCh kVex[] = u"VEX";
+constexpr XMLCh kSampleSet[] = u"SampleSet";
+constexpr XMLCh kSample[] = u"Sample";
+constexpr XMLCh kSampleAttribute[] = u"SampleAttribute";
+constexpr XMLCh kConditions[] = u"Conditions";
+constexpr XMLCh kId[] = u"ID";
+constexpr XMLCh kSpectrum[] = u"Spectrum";
+constexpr XMLCh kValue[] = u"Value";
+constexpr XMLCh kName[] = u"Name";
+constexpr XMLCh kAdditionalData[] = u"AdditionalData";
+constexpr XMLCh kAnyElement[] = u"*";
+
+struct HeaderKey {
+  const XMLCh* element;
+  const char* key;
+};
+
+constexpr std::array<HeaderKey, 5> kHeaderKeys = {{
+    {kName, Header::kNameKey},
+    {u"Description", Header::kDescriptionKey},
+    {u"Creator", Header::kCreatorKey},
+    {u"Created", Header::kCreatedKey},
+    {u"Modified", Header::kModifiedKey},
+}};
+
+// Calls `visit(name, holder)` for every child that has an attribute, with the value of its first
+// one, whatever child and attribute are called.
+template <class Visit>
+void ForEachNamedChild(const NodeHolder& parent, Visit visit) {
+  for (DOMNode* child = parent.GetXMLNode().getFirstChild(); child != nullptr;
+       child = child->getNextSibling()) {
+    const NodeHolder holder(child);
+    if (const DOMNode* attribute = holder.FirstAttribute()) {
+      visit(ToNativeString(attribute->getNodeValue()), holder);
+    }
+  }
+}
+
+// Calls `visit(name, holder)` for every "Value" child whose first attribute is called "Name".
+template <class Visit>
+void ForEachValue(const NodeHolder& parent, Visit visit) {
+  for (NodeHolder value = parent.FindChild(kValue, false); !value.IsNull();
+       value = value.NextSibling(kValue, false)) {
+    const DOMNode* const attribute = value.FirstAttribute();
+    if (attribute != nullptr && XMLString::equals(attribute->getNodeName(), kName)) {
+      visit(attribute->getNodeValue(), value);
+    }
+  }
+}
+
+// A custom illumination is read against these, whatever its block says.
+Conditions CustomIlluminationConditions() {
+  Conditions conditions;
+  conditions.AddAttribute(ConditionKeys::kWavelengthMin, "380nm");
+  conditions.AddAttribute(ConditionKeys::kWavelengthMax, "730nm");
+  conditions.AddAttribute(ConditionKeys::kPointCount, "36");
+  conditions.AddAttribute(ConditionKeys::kSpectrumType, "AmbientLight");
+  return conditions;
+}
+
+}  // namespace
+
+XMLLoader::XMLLoader(NodeHolder document) : current_(document) {}
+
+SmartPointer<VEX> XMLLoader::Load() try {
+  current_ = current_.FindChild(kVex, true);
+  SmartPointer<VEX> vex(new VEX);
+  vex->AcceptVisitor(*this);
+  return vex;
+}
+ALDERMOOR_FRAME(Aldermoor::Vexdoc::Internals::XMLLoader::Load)
+
+void XMLLoader::VisitVex(VEX& vex) try {
+  condition_links_.clear();
+  for (NodeHolder block = current_.FindChild(kConditions, false); !block.IsNull();
+       block = block.NextSibling(kConditions, false)) {
+    ConditionParser(block);
+  }
+  LoadVexNode(vex, kSampleSet);
+}
+ALDERMOOR_FRAME(Aldermoor::Vexdoc::Internals::XMLLoader::VisitVex)
+
+void XMLLoader::VisitSampleSet(SampleSet& set) try { LoadVexNode(set, kSample); }
+ALDERMOOR_FRAME(Aldermoor::Vexdoc::Internals::XMLLoader::VisitSampleSet)
+
+void XMLLoader::VisitSample(Sample& sample) try { LoadVexNode(sample, kSampleAttribute); }
+ALDERMOOR_FRAME(Aldermoor::Vexdoc::Internals::XMLLoader::VisitSample)
+
+void XMLLoader::VisitSpectrum(Spectrum& spectrum) try { LoadSampleAttribute(spectrum); }
+ALDERMOOR_FRAME(Aldermoor::Vexdoc::Internals::XMLLoader::VisitSpectrum)
+
+void XMLLoader::VisitColorVector(ColorVector& vector) try { LoadSampleAttribute(vector); }
+ALDERMOOR_FRAME(Aldermoor::Vexdoc::Internals::XMLLoader::VisitColorVector)
+
+void XMLLoader::VisitRecipe(Recipe& recipe) try { LoadSampleAttribute(recipe); }
+ALDERMOOR_FRAME(Aldermoor::Vexdoc::Internals::XMLLoader::VisitRecipe)
+
+void XMLLoader::VisitUnknownSampleAttribute(UnknownSampleAttribute& attribute) try {
+  LoadSampleAttribute(attribute);
+}
+ALDERMOOR_FRAME(Aldermoor::Vexdoc::Internals::XMLLoader::VisitUnknownSampleAttribute)
+
+template <class Node>
+void XMLLoader::LoadVexNode(Node& node, const XMLCh* childName) {
+  using Child = typename Node::Pointer;
+  HeaderParser(current_, node, false);
+  const bool wrapped = childName == kSampleAttribute;
+  for (NodeHolder child = current_.FindChild(childName, false); !child.IsNull();
+       child = child.NextSibling(childName, false)) {
+    current_ = wrapped ? child.FindChild(kAnyElement, false) : child;
+    const SmartPointer<Header> element =
+        ElementFactory::GetInstance().CreateElement(current_.GetName());
+    element->AcceptVisitor(*this);
+    // Not an insertion: equal names of a file stay, and so does its "Modified".
+    using Element = std::remove_reference_t<decltype(*std::declval<Child>())>;
+    DocumentAccess::Append(node, DynamicCast<Element>(element));
+  }
+}
+
+template <class Attribute>
+void XMLLoader::LoadSampleAttribute(Attribute& attribute) {
+  const XMLCh* const link = current_.AttributeValue(kConditions);
+  if (link == nullptr) {
+    throw VexException(
+        "Missing condition-link",
+        ALDERMOOR_HERE(Aldermoor::Vexdoc::Internals::XMLLoader::LoadSampleAttribute));
+  }
+  const auto known = condition_links_.find(ToNativeString(link));
+  const std::string id = known == condition_links_.end() ? "" : known->second;
+  attribute.SetConditions(ConditionManager::GetInstance().GetConditions(id));
+  HeaderParser(current_, attribute, true);
+  LoadMembers(attribute);
+}
+
+void XMLLoader::HeaderParser(NodeHolder& holder, Header& header, bool isSampleAttribute) try {
+  // One walk over the children for all keys; the first child of a name counts.
+  std::array<DOMNode*, kHeaderKeys.size()> found{};
+  DOMNode* additional_data = nullptr;
+  for (DOMNode* child = holder.GetXMLNode().getFirstChild(); child != nullptr;
+       child = child->getNextSibling()) {
+    if (child->getNodeType() != DOMNode::ELEMENT_NODE) {
+      continue;
+    }
+    for (std::size_t i = 0; i < kHeaderKeys.size(); ++i) {
+      if (found[i] == nullptr && XMLString::equals(child->getNodeName(), kHeaderKeys[i].element)) {
+        found[i] = child;
+      }
+    }
+    if (additional_data == nullptr && XMLString::equals(child->getNodeName(), kAdditionalData)) {
+      additional_data = child;
+    }
+  }
+  if (found[0] == nullptr && !isSampleAttribute) {
+    holder.FindChild(kName, true);  // raises the failure
+  }
+  for (std::size_t i = 0; i < kHeaderKeys.size(); ++i) {
+    if (found[i] != nullptr) {
+      header.SetAttribute(kHeaderKeys[i].key, NodeHolder(found[i]).GetText());
+    }
+  }
+  if (additional_data != nullptr) {
+    ForEachNamedChild(NodeHolder(additional_data),
+                      [&header](const std::string& key, const NodeHolder& child) {
+                        header.SetAttribute(key, child.GetText());
+                      });
+  }
+}
+ALDERMOOR_FRAME(Aldermoor::Vexdoc::Internals::XMLLoader::HeaderParser)
+
+void XMLLoader::ConditionParser(NodeHolder& block) try {
+  Conditions conditions("0");
+  const NodeHolder id = block.FindChild(kId, true);
+  ForEachNamedChild(block, [&conditions](const std::string& key, const NodeHolder& child) {
+    if (!child.IsElement(kSpectrum)) {
+      conditions.AddAttribute(key, child.GetText());
+    }
+  });
+  if (NodeHolder spectrum = id.NextSibling(kSpectrum, false); !spectrum.IsNull()) {
+    const Conditions own = CustomIlluminationConditions();
+    std::vector<float> data;
+    SpectrumVectorParser(spectrum, own, data);
+    conditions.SetCustomIllumination(Spectrum(own, data));
+  }
+  condition_links_[id.GetText()] =
+      ConditionManager::GetInstance().GetOrCreateConditions(conditions)->GetID();
+}
+ALDERMOOR_FRAME(Aldermoor::Vexdoc::Internals::XMLLoader::ConditionParser)
+
+void XMLLoader::SpectrumVectorParser(NodeHolder& holder, const Conditions& conditions,
+                                     std::vector<float>& out) try {
+  const auto expected = Utilities::Tools::lexical_cast<unsigned int>(
+      conditions.GetAttribute(ConditionKeys::kPointCount, "36"));
+  std::vector<std::pair<unsigned int, float>> points;
+  ForEachValue(holder, [&points](const XMLCh* wavelength, const NodeHolder& value) {
+    points.emplace_back(ReadUnsigned(wavelength), value.GetFloat());
+  });
+  const auto by_wavelength = [](const auto& a, const auto& b) {
+    return a.first < b.first;
+  };
+  if (!std::is_sorted(points.begin(), points.end(), by_wavelength)) {
+    std::stable_sort(points.begin(), points.end(), by_wavelength);
+  }
+  const auto same_wavelength = [](const auto& a, const auto& b) {
+    return a.first == b.first;
+  };
+  points.erase(std::unique(points.begin(), points.end(), same_wavelength), points.end());
+  if (points.size() != expected) {
+    throw VexParseException(
+        "Missing Spectrum elements in XML",
+        ALDERMOOR_HERE(Aldermoor::Vexdoc::Internals::XMLLoader::SpectrumVectorParser));
+  }
+  out.resize(points.size());
+  std::transform(points.begin(), points.end(), out.begin(),
+                 [](const auto& point) { return point.second; });
+}
+ALDERMOOR_FRAME(Aldermoor::Vexdoc::Internals::XMLLoader::SpectrumVectorParser)
+
+void XMLLoader::LoadMembers(Spectrum& spectrum) try {
+  SpectrumVectorParser(current_, *spectrum.GetConditions(), DocumentAccess::Data(spectrum));
+}
+ALDERMOOR_FRAME(Aldermoor::Vexdoc::Internals::XMLLoader::LoadMembers)
+
+void XMLLoader::LoadMembers(ColorVector& vector) try {
+  std::vector<std::pair<std::string, float>> channels;
+  ForEachValue(current_, [&channels](const XMLCh* label, const NodeHolder& value) {
+    channels.emplace_back(ToNativeString(label), value.GetFloat());
+  });
+  DocumentAccess::ReplaceContent(vector, ColorVector(*vector.GetConditions(), channels));
+}
+ALDERMOOR_FRAME(Aldermoor::Vexdoc::Internals::XMLLoader::LoadMembers)
+
+void XMLLoader::LoadMembers(Recipe& recipe) try {
+  if (const NodeHolder name = current_.FindChild(u"AssortmentName", false); !name.IsNull()) {
+    recipe.SetAssortmentName(name.GetText());
+  }
+  if (const NodeHolder thickness = current_.FindChild(u"Thickness", false); !thickness.IsNull()) {
+    recipe.SetThickness(thickness.GetFloat());
+  }
+  if (const NodeHolder link = current_.FindChild(u"SubstrateLinkName", false); !link.IsNull()) {
+    recipe.SetSubstrateLinkName(link.GetText());
+  }
+  if (const NodeHolder list = current_.FindChild(u"Components", false); !list.IsNull()) {
+    Recipe::Components components;
+    ForEachNamedChild(list, [&components](const std::string& name, const NodeHolder& child) {
+      components.emplace_back(name, child.GetFloat());
+    });
+    recipe.SetComponents(components);
+  }
+}
+ALDERMOOR_FRAME(Aldermoor::Vexdoc::Internals::XMLLoader::LoadMembers)
+
+void XMLLoader::LoadMembers(UnknownSampleAttribute& attribute) try {
+  DocumentAccess::ReplaceContent(attribute, UnknownSampleAttribute(VEXDataTreeParser(current_)));
+}
+ALDERMOOR_FRAME(Aldermoor::Vexdoc::Internals::XMLLoader::LoadMembers)
+
+// Recursion is bounded by the depth that the parser lets through.
+SmartPointer<DataTree> XMLLoader::VEXDataTreeParser(const NodeHolder& holder) try {
+  SmartPointer<DataTree> tree(new DataTree);
+  std::string name;
+  std::string value;
+  if (holder.GetAttribute(name, value)) {
+    tree->SetAttribute(name, value);
+  }
+  std::string text = holder.GetText();
+  if (text.starts_with('\n')) {
+    text.clear();  // the indentation in front of the first child
+  }
+  tree->SetName(holder.GetName());
+  tree->SetValue(text);
+  for (NodeHolder child = holder.FindChild(kAnyElement, false); !child.IsNull();
+       child = child.NextSibling(kAnyElement, false)) {
+    tree->AdoptChild(VEXDataTreeParser(child));
+  }
+  return tree;
+}
+ALDERMOOR_FRAME(Aldermoor::Vexdoc::Internals::XMLLoader::VEXDataTreeParser)
+
+}  // namespace Aldermoor::Vexdoc::Internals

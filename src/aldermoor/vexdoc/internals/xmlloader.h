@@ -1,0 +1,67 @@
+#ifndef ALDERMOOR_VEXDOC_INTERNALS_XMLLOADER_H
+#define ALDERMOOR_VEXDOC_INTERNALS_XMLLOADER_H
+
+#include <map>
+#include <string>
+#include <vector>
+
+#include "aldermoor/utilities/tools/smartpointer.h"
+#include "aldermoor/vexdoc/dataitem.h"
+#include "aldermoor/vexdoc/elementvisitor.h"
+#include "aldermoor/vexdoc/internals/nodeholder.h"
+#include "aldermoor/vexdoc/vex.h"
+
+namespace Aldermoor::Vexdoc::Internals {
+
+/// Builds a new document from the DOM of one in the current dialect.
+///
+/// An empty element accepts the loader, and its Visit operation fills it from the node on which
+/// the loader stands.  Condition blocks are read first and given to the ConditionManager; links
+/// are translated from the file's IDs to those of the manager.
+/// Throws: VexException, VexParseException, ResourceNotAvailableException, InvalidArgumentException
+/// and NullPointerException for content that breaks the rules of the format.
+class XMLLoader : public ElementVisitor {
+ public:
+  /// `document` stands on the DOM document node.
+  explicit XMLLoader(NodeHolder document);
+
+  Utilities::Tools::SmartPointer<VEX> Load();
+
+  void VisitVex(VEX& vex) override;
+  void VisitSampleSet(SampleSet& set) override;
+  void VisitSample(Sample& sample) override;
+  void VisitSpectrum(Spectrum& spectrum) override;
+  void VisitColorVector(ColorVector& vector) override;
+  void VisitRecipe(Recipe& recipe) override;
+  void VisitUnknownSampleAttribute(UnknownSampleAttribute& attribute) override;
+
+ protected:
+  /// "Name" is optional for sample attributes only.
+  virtual void HeaderParser(NodeHolder& holder, Header& header, bool isSampleAttribute);
+  virtual void ConditionParser(NodeHolder& block);
+  virtual void LoadMembers(UnknownSampleAttribute& attribute);
+  virtual void LoadMembers(Recipe& recipe);
+  virtual void LoadMembers(ColorVector& vector);
+  virtual void LoadMembers(Spectrum& spectrum);
+
+  /// The values of the "Value" children in ascending order of wavelength; of equal wavelengths the
+  /// first counts.
+  void SpectrumVectorParser(NodeHolder& holder, const Conditions& conditions,
+                            std::vector<float>& out);
+  Utilities::Tools::SmartPointer<DataTree> VEXDataTreeParser(const NodeHolder& holder);
+
+  NodeHolder& CurrentNode() { return current_; }
+
+ private:
+  template <class Node>
+  void LoadVexNode(Node& node, const XMLCh* childName);
+  template <class Attribute>
+  void LoadSampleAttribute(Attribute& attribute);
+
+  std::map<std::string, std::string> condition_links_;  // ID in the file to ID in the manager
+  NodeHolder current_;
+};
+
+}  // namespace Aldermoor::Vexdoc::Internals
+
+#endif  // ALDERMOOR_VEXDOC_INTERNALS_XMLLOADER_H

@@ -1,0 +1,24 @@
+#ifndef ALDERMOOR_VEXDOC_INTERNALS_XMLPARSERADAPTER_H
+#define ALDERMOOR_VEXDOC_INTERNALS_XMLPARSERADAPTER_H
+
+#include <iosfwd>
+
+#include "aldermoor/utilities/filesystem/file.h"
+
+namespace Aldermoor::Vexdoc::Internals {
+
+/// Fills the document that it serves from XML; lives for one call.
+class XMLParserAdapter {
+ public:
+  XMLParserAdapter() = default;
+  XMLParserAdapter(const XMLParserAdapter&) = delete;
+  XMLParserAdapter& operator=(const XMLParserAdapter&) = delete;
+  virtual ~XMLParserAdapter() = default;
+
+  virtual void Load(std::istream& in) = 0;
+  virtual void Load(Utilities::FileSystem::File& file) = 0;
+};
+
+}  // namespace Aldermoor::Vexdoc::Internals
+
+#endif  // ALDERMOOR_VEXDOC_INTERNALS_XMLPARSERADAPTER_H

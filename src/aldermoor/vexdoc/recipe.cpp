@@ -1,0 +1,110 @@
+#include "aldermoor/vexdoc/recipe.h"
+
+#include <algorithm>
+#include <cmath>
+
+#include "aldermoor/utilities/exceptions/exceptions.h"
+#include "aldermoor/utilities/exceptions/frame.h"
+#include "aldermoor/vexdoc/elementvisitor.h"
+
+namespace Aldermoor::Vexdoc {
+
+using Utilities::Exceptions::ResourceNotAvailableException;
+using Utilities::Tools::SmartPointer;
+
+namespace {
+
+constexpr float kThicknessTolerance = 0.01F;
+
+}  // namespace
+
+Recipe::Recipe() = default;
+
+Recipe::Recipe(const Conditions& conditions, const std::string& assortmentName,
+               const float& thickness, const std::string& substrateLinkName,
+               const Components& components) try
+    : AbstractSampleAttribute(conditions),
+      assortment_name_(assortmentName),
+      thickness_(thickness),
+      substrate_link_name_(substrateLinkName),
+      components_(components) {}
+ALDERMOOR_FRAME(Aldermoor::Vexdoc::Recipe::Recipe)
+
+Recipe::Recipe(const Recipe&) = default;
+
+Recipe& Recipe::operator=(const Recipe&) = default;
+
+Recipe::~Recipe() = default;
+
+void Recipe::AcceptVisitor(ElementVisitor& visitor) try { visitor.VisitRecipe(*this); }
+ALDERMOOR_FRAME(Aldermoor::Vexdoc::Recipe::AcceptVisitor)
+
+SmartPointer<SampleAttribute> Recipe::TransformTo(const std::string& type,
+                                                  const Conditions& /*conditions*/) try {
+  throw ResourceNotAvailableException("could not transform recipe to '" + type + "'", "");
+}
+ALDERMOOR_FRAME(Aldermoor::Vexdoc::Recipe::TransformTo)
+
+SampleAttribute& Recipe::Assign(const SampleAttribute& other) try {
+  if (const auto* recipe = dynamic_cast<const Recipe*>(&other)) {
+    *this = *recipe;
+  }
+  return *this;
+}
+ALDERMOOR_FRAME(Aldermoor::Vexdoc::Recipe::Assign)
+
+bool Recipe::Equals(const SampleAttribute& other) const try {
+  const auto* recipe = dynamic_cast<const Recipe*>(&other);
+  return recipe != nullptr && GetAssortmentName() == recipe->GetAssortmentName() &&
+         GetSubstrateLinkName() == recipe->GetSubstrateLinkName() &&
+         std::abs(GetThickness() - recipe->GetThickness()) <= kThicknessTolerance &&
+         GetComponents() == recipe->GetComponents() &&
+         GetConditions()->Equals(*recipe->GetConditions());
+}
+ALDERMOOR_FRAME(Aldermoor::Vexdoc::Recipe::Equals)
+
+void Recipe::SetAssortmentName(const std::string& name) {
+  assortment_name_ = name;
+}
+
+std::string Recipe::GetAssortmentName() const {
+  return assortment_name_;
+}
+
+void Recipe::SetThickness(const float& thickness) {
+  thickness_ = thickness;
+}
+
+float Recipe::GetThickness() const {
+  return thickness_;
+}
+
+void Recipe::SetSubstrateLinkName(const std::string& name) {
+  substrate_link_name_ = name;
+}
+
+std::string Recipe::GetSubstrateLinkName() const {
+  return substrate_link_name_;
+}
+
+void Recipe::SetComponents(const Components& components) {
+  components_ = components;
+}
+
+const Recipe::Components& Recipe::GetComponents() const {
+  return components_;
+}
+
+void Recipe::AddConcentration(const std::string& name, const float& amount) try {
+  const auto component = std::find_if(components_.begin(), components_.end(),
+                                      [&name](const auto& entry) { return entry.first == name; });
+  if (component != components_.end()) {
+    const float sum = component->second + amount;
+    component->second = sum < 0.0F ? 0.0F : sum;
+  } else if (amount > 0.0F) {
+    components_.emplace_back(name, amount);
+  }
+}
+ALDERMOOR_FRAME(Aldermoor::Vexdoc::Recipe::AddConcentration)
+
+}  // namespace Aldermoor::Vexdoc

@@ -1,0 +1,100 @@
+#include "aldermoor/vexdoc/sample.h"
+
+#include "aldermoor/utilities/exceptions/exceptions.h"
+#include "aldermoor/utilities/exceptions/frame.h"
+#include "aldermoor/vexdoc/elementvisitor.h"
+#include "aldermoor/vexdoc/sampleset.h"
+#include "aldermoor/vexdoc/setparent.h"
+#include "aldermoor/vexdoc/vexnode.inl.h"
+
+namespace Aldermoor::Vexdoc {
+
+using Utilities::Exceptions::Filled;
+using Utilities::Exceptions::ResourceNotAvailableException;
+using Utilities::Tools::SmartPointer;
+
+namespace {
+
+constexpr const char* kSpectrumType = "VEXSpectrum";
+
+}  // namespace
+
+template class VexNode<SampleAttribute, MultiStoragePolicy<SampleAttribute>>;
+
+Sample::Sample(const std::string& name) try : VexNode(name) {}
+ALDERMOOR_FRAME(Aldermoor::Vexdoc::Sample::Sample)
+
+Sample::Sample(const Sample&) = default;
+Sample& Sample::operator=(const Sample&) = default;
+Sample::~Sample() = default;
+
+void Sample::AddSampleAttribute(const SmartPointer<SampleAttribute>& attribute) try {
+  AddElement(attribute);
+}
+ALDERMOOR_FRAME(Aldermoor::Vexdoc::Sample::AddSampleAttribute)
+
+SmartPointer<SampleAttribute> Sample::GetSampleAttribute(const std::string& type,
+                                                         const Conditions& conditions,
+                                                         bool store) const try {
+  if (GetElements().empty()) {
+    throw ResourceNotAvailableException("Sample " + GetName() + " has no sample attributes !!", "");
+  }
+  if (SmartPointer<SampleAttribute> stored = FindStored(type, conditions)) {
+    return stored;
+  }
+  SmartPointer<SampleAttribute> result = Compute(type, conditions, true);
+  if (!result) {
+    result = Compute(type, conditions, false);
+  }
+  if (!result) {
+    throw ResourceNotAvailableException(
+        Filled("No '%TYPE%' found satisfying the specified conditions", "%TYPE%", type),
+        ALDERMOOR_HERE(Aldermoor::Vexdoc::Sample::GetSampleAttribute));
+  }
+  if (store) {
+    result->SetDerived(false);
+    const_cast<Sample*>(this)->AddElement(result);  // asked for by the caller
+  }
+  return result;
+}
+ALDERMOOR_FRAME(Aldermoor::Vexdoc::Sample::GetSampleAttribute)
+
+SmartPointer<SampleAttribute> Sample::FindStored(const std::string& type,
+                                                 const Conditions& conditions) const {
+  const bool any_conditions = type == kSpectrumType && conditions.IsEmpty();
+  for (const auto& [name, attribute] : GetElements()) {
+    if (attribute->GetType() == type &&
+        (any_conditions || conditions.IsSubsetOf(*attribute->GetConditions()))) {
+      return attribute;
+    }
+  }
+  return {};
+}
+
+SmartPointer<SampleAttribute> Sample::Compute(const std::string& type, const Conditions& conditions,
+                                              bool from_spectra) const {
+  for (const auto& [name, attribute] : GetElements()) {
+    if ((attribute->GetType() == kSpectrumType) != from_spectra) {
+      continue;
+    }
+    try {
+      return attribute->TransformTo(type, conditions);
+    } catch (const ResourceNotAvailableException&) {
+      // This attribute cannot give it; the next one may.
+    }
+  }
+  return {};
+}
+
+void Sample::RemoveAll() try { Clear(); }
+ALDERMOOR_FRAME(Aldermoor::Vexdoc::Sample::RemoveAll)
+
+void Sample::SetParent(Header* parent) try {
+  StoreParent(MovedToParent<SampleSet>(*this, GetParent(), parent));
+}
+ALDERMOOR_FRAME(Aldermoor::Vexdoc::Sample::SetParent)
+
+void Sample::AcceptVisitor(ElementVisitor& visitor) try { visitor.VisitSample(*this); }
+ALDERMOOR_FRAME(Aldermoor::Vexdoc::Sample::AcceptVisitor)
+
+}  // namespace Aldermoor::Vexdoc

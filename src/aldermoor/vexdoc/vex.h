@@ -1,0 +1,86 @@
+#ifndef ALDERMOOR_VEXDOC_VEX_H
+#define ALDERMOOR_VEXDOC_VEX_H
+
+#include <iosfwd>
+#include <string>
+
+#include "aldermoor/export.h"
+#include "aldermoor/utilities/filesystem/file.h"
+#include "aldermoor/vexdoc/sampleset.h"
+#include "aldermoor/vexdoc/vexnode.h"
+
+namespace Aldermoor::Vexdoc {
+
+extern template class ALDERMOOR_EXPORT VexNode<SampleSet, UniqueStoragePolicy<SampleSet>>;
+
+/// The look-up and the streams of a document, as a layer of its own.
+template <class T, class StoragePolicy>
+class DeprecatedVEXInterface : public VexNode<T, StoragePolicy> {
+ public:
+  virtual Utilities::Tools::SmartPointer<T> GetSampleSet(const std::string& name) const = 0;
+  virtual void Load(std::istream& in) = 0;
+
+ protected:
+  using VexNode<T, StoragePolicy>::VexNode;
+};
+
+/// A document of measured colour: sample sets in order under unique names.
+///
+/// A document belongs to one thread at a time.  For reading and writing, the application keeps an
+/// XMLPlatform alive.
+class ALDERMOOR_EXPORT VEX
+    : public DeprecatedVEXInterface<SampleSet, UniqueStoragePolicy<SampleSet>> {
+ public:
+  explicit VEX(const std::string& name = "");
+  /// Deep.
+  VEX(const VEX& other);
+  VEX& operator=(const VEX& other);
+  ~VEX() override;
+
+  /// Throws: ResourceNotAvailableException if there is no such set.
+  Utilities::Tools::SmartPointer<SampleSet> GetSampleSet(const std::string& name) const override;
+  /// Replaces the content of this document by the XML read from `in`.  The document is emptied
+  /// first, and stays empty if the text cannot be read.
+  /// Throws: VexXMLParseException with line and column if the text is not well-formed;
+  /// VexException if its content breaks a rule.
+  void Load(std::istream& in) override;
+  /// Replaces the content of this document by that of the XML file `file`; on failure it stays as
+  /// it was.  No cache is kept beside the file yet, so `updateCache` has no effect.
+  /// Throws: VexXMLParseException with file, line and column if the text is not well-formed;
+  /// VexParseException and VexException if its content breaks a rule or the file cannot be read.
+  void LoadXML(const Utilities::FileSystem::File& file, bool updateCache);
+
+  /// The forms that add or insert keep a copy and return its name, which is another one if the
+  /// name was taken.  Indices count from 0 to the number of children.
+  std::string AddSampleSet(const SampleSet& set);
+  std::string AddSampleSet(const std::string& name);
+  std::string InsertSampleSet(const SampleSet& set, const long& position);
+  std::string InsertSampleSet(const std::string& name, const long& position);
+  std::string RenameSampleSet(const std::string& oldName, const std::string& newName);
+  void RemoveSampleSet(const std::string& name);
+  void RemoveAllSampleSets();
+  const ElementList<SampleSet>& GetSampleSets() const { return GetElements(); }
+  unsigned long GetSampleSetCount() { return Size(); }
+
+  /// A set of that name is made if there is none.
+  std::string AddSample(const std::string& setName, const Sample& sample);
+  std::string InsertSample(const std::string& setName, const Sample& sample, const long& position);
+  /// Throws: OutOfRangeException if there is no such set or no such sample in it.
+  Utilities::Tools::SmartPointer<Sample> FindSample(const std::string& setName,
+                                                    const std::string& sampleName) const;
+  /// Throws: ResourceNotAvailableException if there is no such set or no such sample in it.
+  std::string RenameSample(const std::string& setName, const std::string& oldName,
+                           const std::string& newName);
+  /// Throws: ResourceNotAvailableException for the set, VexException for a missing sample.
+  void SwapSample(const std::string& setName, const std::string& first, const std::string& second);
+  /// "Unknown" if there is no such set.
+  std::string GetUniqueSampleName(const std::string& setName, const std::string& name);
+
+  /// Throws: std::logic_error, always: a document is the root.
+  void SetParent(Header* parent) override;
+  void AcceptVisitor(ElementVisitor& visitor) override;
+};
+
+}  // namespace Aldermoor::Vexdoc
+
+#endif  // ALDERMOOR_VEXDOC_VEX_H
