@@ -8,6 +8,7 @@
 #include <string>
 #include <type_traits>
 
+#include "aldermoor/export.h"
 #include "aldermoor/utilities/exceptions/exceptions.h"
 #include "aldermoor/utilities/exceptions/frame.h"
 #include "aldermoor/utilities/tools/typename.h"
@@ -20,6 +21,9 @@ namespace Aldermoor::Utilities::Tools {
 /// everybody's pointer good.
 class ReferenceCount {
  public:
+  static ALDERMOOR_EXPORT ReferenceCount* New();
+  static ALDERMOOR_EXPORT void Delete(ReferenceCount* count);
+
   static constexpr std::uint16_t kStuck = std::numeric_limits<std::uint16_t>::max();
 
   void Increase() { count_ = count_ == kStuck ? kStuck : static_cast<std::uint16_t>(count_ + 1); }
@@ -50,7 +54,7 @@ class SmartPointer {
   explicit SmartPointer(T* pointee) {
     if (pointee != nullptr) {
       std::unique_ptr<T> guard(pointee);  // the count is allocated before the object is ours
-      count_ = new ReferenceCount;
+      count_ = ReferenceCount::New();
       pointee_ = guard.release();
       count_->Increase();
     }
@@ -150,7 +154,7 @@ class SmartPointer {
     pointee_ = nullptr;
     if (count != nullptr && count->Decrease()) {
       delete pointee;
-      delete count;
+      ReferenceCount::Delete(count);
     }
   }
 
