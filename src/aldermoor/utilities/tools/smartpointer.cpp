@@ -5,8 +5,12 @@ namespace Aldermoor::Utilities::Tools {
 // Out of sight of the optimiser, which otherwise follows one pointer's release into the use of
 // another one and warns of a use after free.
 
-ReferenceCount* ReferenceCount::New() { return new ReferenceCount; }
+ReferenceCount* ReferenceCount::New() {
+  return new ReferenceCount;
+}
 
-void ReferenceCount::Delete(ReferenceCount* count) { delete count; }
+void ReferenceCount::Delete(ReferenceCount* count) {
+  delete count;
+}
 
 }  // namespace Aldermoor::Utilities::Tools
