@@ -22,6 +22,9 @@ class ALDERMOOR_EXPORT AbstractSampleAttribute : public SampleAttribute {
   std::string GetType() const override;
   bool operator==(const SampleAttribute& other) const override;
   bool operator!=(const SampleAttribute& other) const override;
+  // For two attributes of concrete classes, which C++20 otherwise finds ambiguous.
+  bool operator==(const AbstractSampleAttribute& other) const { return Equals(other); }
+  bool operator!=(const AbstractSampleAttribute& other) const { return !Equals(other); }
   const Utilities::Tools::SmartPointer<Conditions>& GetConditions() const override {
     return conditions_;
   }

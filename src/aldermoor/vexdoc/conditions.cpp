@@ -68,8 +68,10 @@ std::string Conditions::AddAttribute(const std::string& key, const std::string& 
     return "";
   }
   NoteChange();
-  const auto [entry, is_new] = attributes_.try_emplace(key, value);
-  if (is_new) {
+  // Keys mostly come in ascending order, as files hold them; the hint then spares the search.
+  const std::size_t count = attributes_.size();
+  const auto entry = attributes_.try_emplace(attributes_.end(), key, value);
+  if (attributes_.size() != count) {
     return "";
   }
   std::string old = std::move(entry->second);

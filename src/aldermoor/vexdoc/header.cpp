@@ -43,7 +43,8 @@ std::string Header::GetAttribute(const std::string& key) const try {
 ALDERMOOR_FRAME(Aldermoor::Vexdoc::Header::GetAttribute)
 
 void Header::SetAttribute(const std::string& key, const std::string& value) try {
-  attributes_.insert_or_assign(key, value);
+  // Files hold their keys in ascending order; the hint then spares the search.
+  attributes_.insert_or_assign(attributes_.end(), key, value);
 }
 ALDERMOOR_FRAME(Aldermoor::Vexdoc::Header::SetAttribute)
 

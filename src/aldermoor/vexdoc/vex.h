@@ -39,8 +39,8 @@ class ALDERMOOR_EXPORT VEX
 
   /// Throws: ResourceNotAvailableException if there is no such set.
   Utilities::Tools::SmartPointer<SampleSet> GetSampleSet(const std::string& name) const override;
-  /// Replaces the content of this document by the XML read from `in`.  The document is emptied
-  /// first, and stays empty if the text cannot be read.
+  /// Replaces the content of this document by the XML read from `in`.  Its sets are removed first,
+  /// and stay so if the text cannot be read.
   /// Throws: VexXMLParseException with line and column if the text is not well-formed;
   /// VexException if its content breaks a rule.
   void Load(std::istream& in) override;

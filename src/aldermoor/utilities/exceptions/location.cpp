@@ -1,5 +1,6 @@
 #include "aldermoor/utilities/exceptions/location.h"
 
+#include <algorithm>
 #include <string_view>
 #include <utility>
 
@@ -31,7 +32,7 @@ std::string& ReplaceAll(const std::string& token, const std::string& replacement
       break;
     }
     text.replace(at, token.size(), replacement);
-    from = at + token.size();
+    from = at + std::max(token.size(), replacement.size());
   }
   return text;
 }

@@ -14,8 +14,9 @@ ALDERMOOR_EXPORT std::string MakeLocation(const char* prefix, const char* functi
 
 /// Replaces every `token` in `text` and returns `text`.
 ///
-/// The search goes on behind the place of the token by the token's own length, whatever the length
-/// of the replacement; so a token that begins inside that stretch is passed over.
+/// The search goes on behind the replacement, so that a token inside it stays as it is.  Behind a
+/// shorter replacement it goes on by the token's own length, and passes over a token that begins
+/// inside that stretch.
 std::string& ReplaceAll(const std::string& token, const std::string& replacement,
                         std::string& text);
 

@@ -3,6 +3,7 @@
 #include <array>
 #include <cstddef>
 #include <ctime>
+#include <limits>
 #include <sstream>
 #include <vector>
 
@@ -14,8 +15,8 @@ namespace {
 
 constexpr std::size_t kLongestText = 64;
 
-// The leading numbers of exactly three parts; false if there are fewer or one has none.
-bool ReadThree(const std::string& text, char delimiter, std::array<int, 3>& numbers) {
+// The leading numbers of the first three parts; false if there are fewer or one has none.
+bool ReadThree(const std::string& text, char delimiter, std::array<long, 3>& numbers) {
   const StringTokenizer tokenizer(text, delimiter);
   const std::vector<std::string>& parts = tokenizer.GetTokens();
   if (parts.size() < numbers.size()) {
@@ -23,18 +24,32 @@ bool ReadThree(const std::string& text, char delimiter, std::array<int, 3>& numb
   }
   for (std::size_t i = 0; i < numbers.size(); ++i) {
     std::istringstream stream(parts[i]);
-    long number = 0;
-    if (!(stream >> number)) {
+    if (!(stream >> numbers[i])) {
       return false;
     }
-    // Far beyond what a calendar field holds; mktime carries what is left.
-    constexpr long kLimit = 1'000'000'000;
-    if (number > kLimit || number < -kLimit) {
-      return false;
-    }
-    numbers[i] = static_cast<int>(number);
   }
   return true;
+}
+
+// The time of calendar fields in standard time; 0 if there is none.
+std::int64_t TimeOf(const std::array<long, 3>& date, const std::array<long, 3>& clock) {
+  constexpr long kFirstYear = 1900;
+  // What a calendar field can hold, with room for the shifts of year and month.
+  constexpr long kLimit = std::numeric_limits<int>::max() - kFirstYear;
+  for (const long number : {date[0], date[1], date[2], clock[0], clock[1], clock[2]}) {
+    if (number > kLimit || number < -kLimit) {
+      return 0;
+    }
+  }
+  std::tm fields{};
+  fields.tm_year = static_cast<int>(date[0] - kFirstYear);
+  fields.tm_mon = static_cast<int>(date[1] - 1);
+  fields.tm_mday = static_cast<int>(date[2]);
+  fields.tm_hour = static_cast<int>(clock[0]);
+  fields.tm_min = static_cast<int>(clock[1]);
+  fields.tm_sec = static_cast<int>(clock[2]);
+  const std::time_t time = std::mktime(&fields);
+  return time == -1 ? 0 : time;
 }
 
 }  // namespace
@@ -57,21 +72,13 @@ void DateTime::SetDateTime(long seconds) {
 
 bool DateTime::SetDateTime(const std::string& text) try {
   const StringTokenizer halves(text, '/');
-  std::array<int, 3> date{};
-  std::array<int, 3> clock{};
+  std::array<long, 3> date{};
+  std::array<long, 3> clock{};
   if (halves.GetTokens().size() < 2 || !ReadThree(halves.GetTokens()[0], '-', date) ||
       !ReadThree(halves.GetTokens()[1], ':', clock)) {
     return false;
   }
-  std::tm fields{};
-  fields.tm_year = date[0] - 1900;
-  fields.tm_mon = date[1] - 1;
-  fields.tm_mday = date[2];
-  fields.tm_hour = clock[0];
-  fields.tm_min = clock[1];
-  fields.tm_sec = clock[2];
-  const std::time_t time = std::mktime(&fields);
-  time_ = time == -1 ? 0 : time;
+  time_ = TimeOf(date, clock);
   return true;
 }
 ALDERMOOR_FRAME(Aldermoor::Utilities::Tools::DateTime::SetDateTime)

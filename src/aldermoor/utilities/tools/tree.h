@@ -19,7 +19,7 @@ class Tree : public T {
   using Children = std::list<SmartPointer<Tree<T>>>;
 
   Tree() = default;
-  explicit Tree(const T& value) : T(value) {}
+  explicit Tree(const T& payload) : T(payload) {}
 
   Tree(const Tree& other) try : T(other), children_(other.children_) { AdoptChildren(); }
   ALDERMOOR_TEMPLATE_FRAME(Name() + "::Tree")

@@ -1,6 +1,7 @@
 #include "aldermoor/vexdoc/internals/conditionmanager.h"
 
 #include <functional>
+#include <utility>
 
 #include "aldermoor/utilities/exceptions/exceptions.h"
 #include "aldermoor/utilities/exceptions/frame.h"
@@ -28,10 +29,13 @@ std::size_t HashOf(const Conditions& conditions) {
 }  // namespace
 
 ConditionManager::Block ConditionManager::AddConditions(const Conditions& conditions) try {
-  const std::string id = GetNextUniqueID();
-  const Block block(new Conditions(id, conditions));
+  return Store(Block(new Conditions(GetNextUniqueID(), conditions)));
+}
+ALDERMOOR_FRAME(Aldermoor::Vexdoc::Internals::ConditionManager::AddConditions)
+
+ConditionManager::Block ConditionManager::Store(const Block& block) {
   block->is_shared_ = true;
-  const auto entry = conditions_.emplace(id, block).first;
+  const auto entry = conditions_.emplace(block->GetID(), block).first;
   if (!is_index_stale_) {
     is_index_stale_ = true;  // should the next line fail
     index_.emplace(HashOf(*block), entry);
@@ -39,11 +43,21 @@ ConditionManager::Block ConditionManager::AddConditions(const Conditions& condit
   }
   return block;
 }
-ALDERMOOR_FRAME(Aldermoor::Vexdoc::Internals::ConditionManager::AddConditions)
 
 ConditionManager::Block ConditionManager::GetOrCreateConditions(const Conditions& conditions) try {
   const Block block = FindEqual(conditions);
   return block ? block : AddConditions(conditions);
+}
+ALDERMOOR_FRAME(Aldermoor::Vexdoc::Internals::ConditionManager::GetOrCreateConditions)
+
+ConditionManager::Block ConditionManager::GetOrCreateConditions(Conditions&& conditions) try {
+  if (const Block block = FindEqual(conditions)) {
+    return block;
+  }
+  const Block block(new Conditions(GetNextUniqueID()));
+  block->attributes_.swap(conditions.attributes_);
+  block->custom_illumination_ = std::move(conditions.custom_illumination_);
+  return Store(block);
 }
 ALDERMOOR_FRAME(Aldermoor::Vexdoc::Internals::ConditionManager::GetOrCreateConditions)
 

@@ -25,6 +25,8 @@ class ConditionManager final : public Utilities::Patterns::Singleton<ConditionMa
   virtual Block AddConditions(const Conditions& conditions);
   /// The first block in the order of the IDs' texts that equals `conditions`, else a new one.
   virtual Block GetOrCreateConditions(const Conditions& conditions);
+  /// The same, but a new block takes the content over: one that was read from a file can be big.
+  Block GetOrCreateConditions(Conditions&& conditions);
   /// Throws: ResourceNotAvailableException if there is no block of that ID.
   virtual Block GetConditions(const std::string& id);
   /// Stores an empty block under the next ID.
@@ -42,6 +44,7 @@ class ConditionManager final : public Utilities::Patterns::Singleton<ConditionMa
 
   using Blocks = std::map<std::string, Block>;
 
+  Block Store(const Block& block);
   std::string GetNextUniqueID();
   Block FindEqual(const Conditions& conditions);
   void UpdateIndex();

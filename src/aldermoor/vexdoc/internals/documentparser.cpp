@@ -2,8 +2,7 @@
 
 #include <xercesc/internal/XMLScanner.hpp>
 #include <xercesc/sax/Locator.hpp>
-#include <xercesc/util/PlatformUtils.hpp>
-#include <xercesc/util/XMLString.hpp>
+#include <xercesc/util/XMLResourceIdentifier.hpp>
 #include <xercesc/validators/DTD/DTDEntityDecl.hpp>
 
 #include "aldermoor/vexdoc/internals/xerceshelper.h"
@@ -12,23 +11,21 @@
 namespace Aldermoor::Vexdoc::Internals {
 
 using xercesc::XercesDOMParser;
-using xercesc::XMLPlatformUtils;
 
-DocumentParser::DocumentParser()
-    : XercesDOMParser(nullptr, XMLPlatformUtils::fgMemoryManager, nullptr) {
+DocumentParser::DocumentParser(ParseBudget& budget) : XercesDOMParser(nullptr, &budget, nullptr) {
   setValidationScheme(Val_Auto);
   setDoNamespaces(false);
   setErrorHandler(&reporter_);
   setCreateEntityReferenceNodes(false);
   // Guards; none of them changes what a harmless document looks like.
   setLoadExternalDTD(false);
-  setEntityResolver(this);
   limits_.setEntityExpansionLimit(kMostExpansions);
   setSecurityManager(&limits_);
 }
 
 void DocumentParser::resetDocument() {
   depth_ = 0;
+  declarations_ = 0;
   XercesDOMParser::resetDocument();
 }
 
@@ -38,6 +35,12 @@ void DocumentParser::startElement(const xercesc::XMLElementDecl& decl, unsigned 
                                   XMLSize_t count, bool is_empty, bool is_root) {
   if (++depth_ > kDeepestElement) {
     Fail("Elements nest deeper than " + std::to_string(kDeepestElement) + " levels");
+  }
+  // The parser's table of names has a fixed number of slots.
+  if (decl.getId() > kMostElementNames &&
+      decl.getId() != xercesc::XMLElementDecl::fgInvalidElemId) {
+    Fail("There are more than " + std::to_string(kMostElementNames) +
+         " different names of elements");
   }
   // For an empty element the base calls endElement itself.
   XercesDOMParser::startElement(decl, uri, prefix, attributes, count, is_empty, is_root);
@@ -49,27 +52,59 @@ void DocumentParser::endElement(const xercesc::XMLElementDecl& decl, unsigned in
   XercesDOMParser::endElement(decl, uri, is_root, prefix);
 }
 
+void DocumentParser::doctypeDecl(const xercesc::DTDElementDecl& decl, const XMLCh* public_id,
+                                 const XMLCh* system_id, bool has_internal, bool has_external) {
+  // The automaton of a content model can be exponentially larger than its text, and nothing that
+  // validation finds would keep a document from being read.
+  if (getValidationScheme() != Val_Never) {
+    Fail("Document types are not validated against");
+  }
+  XercesDOMParser::doctypeDecl(decl, public_id, system_id, has_internal, has_external);
+}
+
+void DocumentParser::attDef(const xercesc::DTDElementDecl& element,
+                            const xercesc::DTDAttDef& attribute, bool is_ignored) {
+  CountDeclaration();
+  XercesDOMParser::attDef(element, attribute, is_ignored);
+}
+
+void DocumentParser::elementDecl(const xercesc::DTDElementDecl& decl, bool is_ignored) {
+  CountDeclaration();
+  XercesDOMParser::elementDecl(decl, is_ignored);
+}
+
 void DocumentParser::entityDecl(const xercesc::DTDEntityDecl& decl, bool is_parameter_entity,
                                 bool is_ignored) {
-  const XMLCh* const text = decl.getValue();
-  if (text != nullptr) {
+  CountDeclaration();
+  if (decl.getValue() != nullptr) {
+    if (is_parameter_entity) {
+      Fail("Parameter entity '" + ToNativeString(decl.getName()) + "' is not read");
+    }
     if (decl.getValueLen() > kLongestEntity) {
       Fail("Entity '" + ToNativeString(decl.getName()) + "' is longer than " +
            std::to_string(kLongestEntity) + " characters");
-    }
-    if (is_parameter_entity && xercesc::XMLString::indexOf(text, u'%') >= 0) {
-      Fail("Parameter entity '" + ToNativeString(decl.getName()) + "' refers to another one");
     }
   }
   XercesDOMParser::entityDecl(decl, is_parameter_entity, is_ignored);
 }
 
-xercesc::InputSource* DocumentParser::resolveEntity(const XMLCh* /*public_id*/,
-                                                    const XMLCh* system_id) {
-  Fail("External entity '" + ToNativeString(system_id) + "' is not opened");
+void DocumentParser::notationDecl(const xercesc::XMLNotationDecl& decl, bool is_ignored) {
+  CountDeclaration();
+  XercesDOMParser::notationDecl(decl, is_ignored);
 }
 
-void DocumentParser::Fail(const std::string& reason) const {
+xercesc::InputSource* DocumentParser::resolveEntity(xercesc::XMLResourceIdentifier* resource) {
+  Fail("External entity '" + ToNativeString(resource->getSystemId()) + "' is not opened");
+}
+
+void DocumentParser::CountDeclaration() {
+  if (++declarations_ > kMostDeclarations) {
+    Fail("The document type makes more than " + std::to_string(kMostDeclarations) +
+         " declarations");
+  }
+}
+
+void DocumentParser::Fail(const std::string& reason) {
   const xercesc::Locator* const place = getScanner()->getLocator();
   throw VexXMLParseException("Fatal error while parsing XML\n" + reason,
                              ToNativeString(place->getSystemId()),

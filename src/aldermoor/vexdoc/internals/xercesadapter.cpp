@@ -7,6 +7,7 @@
 #include <xercesc/dom/DOMDocument.hpp>
 #include <xercesc/framework/LocalFileInputSource.hpp>
 #include <xercesc/framework/MemBufInputSource.hpp>
+#include <xercesc/util/OutOfMemoryException.hpp>
 #include <xercesc/util/PlatformUtils.hpp>
 #include <xercesc/util/XMLException.hpp>
 
@@ -14,6 +15,7 @@
 #include "aldermoor/utilities/exceptions/frame.h"
 #include "aldermoor/vexdoc/internals/documentaccess.h"
 #include "aldermoor/vexdoc/internals/documentparser.h"
+#include "aldermoor/vexdoc/internals/parsebudget.h"
 #include "aldermoor/vexdoc/internals/xerceshelper.h"
 #include "aldermoor/vexdoc/vexexception.h"
 
@@ -63,7 +65,7 @@ void XercesAdapter::Load(std::istream& in) try {
     const xercesc::MemBufInputSource source(reinterpret_cast<const XMLByte*>(bytes.data()),
                                             bytes.size(), kStreamName, false,
                                             XMLPlatformUtils::fgMemoryManager);
-    LoadFrom(source);
+    LoadFrom(source, bytes.size());
   } catch (const XMLException& e) {
     throw VexException(
         Filled("An internal XML exception has occured while initializing XML:\n%REASON%",
@@ -91,7 +93,7 @@ void XercesAdapter::Load(File& file) try {
   try {
     const xercesc::LocalFileInputSource source(XMLChBuffer(path).Get(),
                                                XMLPlatformUtils::fgMemoryManager);
-    LoadFrom(source);
+    LoadFrom(source, static_cast<std::size_t>(file.GetSize()));
   } catch (const XMLException& e) {
     throw VexException(
         Filled("An internal XML exception has occurred while loading XML:\n'%REASON%'", "%REASON%",
@@ -116,14 +118,22 @@ SmartPointer<XMLLoader> XercesAdapter::GetLoader(xercesc::DOMDocument* document)
 }
 ALDERMOOR_FRAME(Aldermoor::Vexdoc::Internals::XercesAdapter::GetLoader)
 
-void XercesAdapter::LoadFrom(const xercesc::InputSource& source) {
-  DocumentParser parser;
+void XercesAdapter::LoadFrom(const xercesc::InputSource& source, std::size_t bytes) {
+  ParseBudget budget(bytes);
+  DocumentParser parser(budget);
   try {
-    parser.parse(source);
-  } catch (const VexException&) {
-    parser.resetDocumentPool();
-    parser.setValidationScheme(xercesc::XercesDOMParser::Val_Never);
-    parser.parse(source);
+    try {
+      parser.parse(source);
+    } catch (const VexException&) {
+      parser.resetDocumentPool();
+      parser.setValidationScheme(xercesc::XercesDOMParser::Val_Never);
+      parser.parse(source);
+    }
+  } catch (const xercesc::OutOfMemoryException&) {
+    throw VexParseException("The document takes more memory than the " +
+                                std::to_string(budget.GetLimit()) + " bytes that a text of " +
+                                std::to_string(bytes) + " bytes may take",
+                            ALDERMOOR_HERE(Aldermoor::Vexdoc::Internals::XercesAdapter::Load));
   }
   const SmartPointer<VEX> loaded = GetLoader(parser.getDocument())->Load();
   DocumentAccess::Swap(*document_, *loaded);

@@ -1,6 +1,8 @@
 #ifndef ALDERMOOR_VEXDOC_INTERNALS_XERCESADAPTER_H
 #define ALDERMOOR_VEXDOC_INTERNALS_XERCESADAPTER_H
 
+#include <cstddef>
+
 #include <xercesc/util/XercesDefs.hpp>
 
 #include "aldermoor/utilities/tools/smartpointer.h"
@@ -18,8 +20,8 @@ namespace Aldermoor::Vexdoc::Internals {
 /// The adapter on Xerces-C++.  A load builds a new document, and only a finished one replaces the
 /// content of the document served.
 ///
-/// A text that fails is parsed a second time without validation, so that a file loads which only
-/// breaks the DTD that it names; external DTDs and entities are never opened.
+/// A text that fails is parsed a second time without validation, so that a file loads whatever the
+/// DTD that it names says; external DTDs and entities are never opened.
 class XercesAdapter : public XMLParserAdapter {
  public:
   /// `document` is not owned.
@@ -35,7 +37,8 @@ class XercesAdapter : public XMLParserAdapter {
   static Utilities::Tools::SmartPointer<XMLLoader> GetLoader(xercesc::DOMDocument* document);
 
  private:
-  void LoadFrom(const xercesc::InputSource& source);
+  // `bytes` is the size of the source.
+  void LoadFrom(const xercesc::InputSource& source, std::size_t bytes);
 
   VEX* document_;
 };

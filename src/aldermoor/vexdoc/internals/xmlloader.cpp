@@ -212,7 +212,7 @@ void XMLLoader::ConditionParser(NodeHolder& block) try {
     conditions.SetCustomIllumination(Spectrum(own, data));
   }
   condition_links_[id.GetText()] =
-      ConditionManager::GetInstance().GetOrCreateConditions(conditions)->GetID();
+      ConditionManager::GetInstance().GetOrCreateConditions(std::move(conditions))->GetID();
 }
 ALDERMOOR_FRAME(Aldermoor::Vexdoc::Internals::XMLLoader::ConditionParser)
 

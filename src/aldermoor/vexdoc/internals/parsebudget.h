@@ -1,0 +1,37 @@
+#ifndef ALDERMOOR_VEXDOC_INTERNALS_PARSEBUDGET_H
+#define ALDERMOOR_VEXDOC_INTERNALS_PARSEBUDGET_H
+
+#include <cstddef>
+
+#include <xercesc/framework/MemoryManager.hpp>
+
+namespace Aldermoor::Vexdoc::Internals {
+
+/// The memory that one parse may hold at a time, in proportion to the size of its source.
+///
+/// A DOM takes up to about 50 bytes a byte of text, where elements are as short as can be; a text
+/// that wants far more only does so through its DTD, and to no good end.  Must outlive the parser.
+class ParseBudget : public xercesc::MemoryManager {
+ public:
+  static constexpr std::size_t kBaseBytes = std::size_t{32} << 20U;
+  static constexpr std::size_t kBytesPerSourceByte = 128;
+
+  explicit ParseBudget(std::size_t source_bytes)
+      : limit_(kBaseBytes + source_bytes * kBytesPerSourceByte) {}
+
+  /// In bytes.
+  std::size_t GetLimit() const { return limit_; }
+
+  /// Throws: xercesc::OutOfMemoryException beyond the limit.
+  void* allocate(XMLSize_t size) override;
+  void deallocate(void* p) override;
+  xercesc::MemoryManager* getExceptionMemoryManager() override;
+
+ private:
+  std::size_t limit_;
+  std::size_t used_ = 0;
+};
+
+}  // namespace Aldermoor::Vexdoc::Internals
+
+#endif  // ALDERMOOR_VEXDOC_INTERNALS_PARSEBUDGET_H
