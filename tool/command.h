@@ -1,0 +1,33 @@
+#ifndef ALDERMOOR_TOOL_COMMAND_H
+#define ALDERMOOR_TOOL_COMMAND_H
+
+#include <memory>
+
+#include <CLI/CLI.hpp>
+
+#include "exitstatus.h"
+
+namespace Aldermoor::Tool {
+
+/// One subcommand of the program.
+class Command {
+ public:
+  Command() = default;
+  Command(const Command&) = delete;
+  Command& operator=(const Command&) = delete;
+  virtual ~Command() = default;
+
+  /// `app` writes into members of this object when it parses.
+  virtual void AddOptions(CLI::App& app) = 0;
+  /// Called once, after the command line was parsed.
+  /// Throws: UsageError; InputError; OutputError.
+  virtual ExitStatus Run() = 0;
+};
+
+// Each of these stands in the file of its subcommand.
+std::unique_ptr<Command> MakeColorCommand();
+std::unique_ptr<Command> MakeInfoCommand();
+
+}  // namespace Aldermoor::Tool
+
+#endif  // ALDERMOOR_TOOL_COMMAND_H

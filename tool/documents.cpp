@@ -1,0 +1,138 @@
+#include "documents.h"
+
+#include <algorithm>
+#include <array>
+#include <cerrno>
+#include <cstdio>
+#include <exception>
+#include <filesystem>
+#include <sstream>
+#include <system_error>
+
+#include <fmt/format.h>
+
+#include "aldermoor/utilities/filesystem/file.h"
+#include "aldermoor/vexdoc/colorvector.h"
+#include "aldermoor/vexdoc/spectrum.h"
+#include "aldermoor/vexdoc/vexexception.h"
+
+#include "diagnostics.h"
+#include "output.h"
+
+namespace Aldermoor::Tool {
+namespace {
+
+std::string ReadStandardInput() {
+  std::string text;
+  std::array<char, 65536> chunk;
+  std::size_t count = 0;
+  errno = 0;
+  while ((count = std::fread(chunk.data(), 1, chunk.size(), stdin)) > 0) {
+    text.append(chunk.data(), count);
+  }
+  if (std::ferror(stdin) != 0) {
+    throw std::system_error(errno, std::generic_category());
+  }
+  return text;
+}
+
+// The library would say no more than that it is not accessible.
+void CheckIsFile(const std::string& path) {
+  std::error_code error;
+  const auto status = std::filesystem::status(path, error);
+  if (!std::filesystem::exists(status)) {
+    throw std::system_error(error ? error.value() : ENOENT, std::generic_category());
+  }
+  if (std::filesystem::is_directory(status)) {
+    throw std::system_error(EISDIR, std::generic_category());
+  }
+}
+
+// Messages of the library may be of several lines, each one the reason of the line above.
+std::string Reason(const std::exception& e) {
+  std::string text;
+  for (const char* c = e.what(); *c != '\0'; ++c) {
+    if (*c != '\n') {
+      text += *c;
+    } else {
+      text += text.ends_with(':') ? " " : ": ";
+    }
+  }
+  return text;
+}
+
+}  // namespace
+
+void LoadDocument(const std::string& path, Vexdoc::VEX& document) {
+  const bool standard = path == kStandardStream;
+  const std::string shown = standard ? "<standard input>" : path;
+  try {
+    if (standard) {
+      std::istringstream in(ReadStandardInput());
+      document.Load(in);
+    } else {
+      CheckIsFile(path);
+      document.LoadXML(Utilities::FileSystem::File(path), false);
+    }
+  } catch (const Vexdoc::VexXMLParseException& e) {
+    throw InputError(fmt::format("{}:{}:{}: {}", shown, e.GetLine(), e.GetColumn(), Reason(e)));
+  } catch (const std::exception& e) {
+    throw InputError(fmt::format("{}: {}", shown, Reason(e)));
+  }
+}
+
+void InputOptions::AddTo(CLI::App& app) {
+  app.add_option("FILE", paths, "Documents to read; - is standard input")
+      ->required()
+      ->type_name("");
+}
+
+bool InputOptions::TryLoad(const std::string& path, Vexdoc::VEX& document) {
+  try {
+    LoadDocument(path, document);
+    return true;
+  } catch (const InputError& e) {
+    Report(e.what());
+    return false;
+  }
+}
+
+void InputOptions::CheckStandardInput(const std::string& other) const {
+  const auto count =
+      std::count(paths.begin(), paths.end(), kStandardStream) + (other == kStandardStream ? 1 : 0);
+  if (count > 1) {
+    throw UsageError("standard input (-) can be read only once");
+  }
+}
+
+void SampleFilter::AddTo(CLI::App& app) {
+  app.add_option("--set", set, "Only the sample set of this name")->type_name("NAME");
+  app.add_option("--sample", sample, "Only samples of this name")->type_name("NAME");
+}
+
+std::string SampleFilter::NoMatchText() const {
+  if (!sample) {
+    return fmt::format("no samples in a set '{}'", set.value_or(""));
+  }
+  return set ? fmt::format("no sample '{}' in a set '{}'", *sample, *set)
+             : fmt::format("no sample '{}'", *sample);
+}
+
+std::string DescribeAttributes(const Vexdoc::Sample& sample) {
+  std::string text;
+  for (const auto& [name, attribute] : sample.GetElements()) {
+    text += text.empty() ? "" : ", ";
+    if (const auto* const spectrum = dynamic_cast<const Vexdoc::Spectrum*>(attribute.Get())) {
+      text += fmt::format("a spectrum of {} values", spectrum->GetData().size());
+    } else if (const auto* const color = dynamic_cast<const Vexdoc::ColorVector*>(attribute.Get());
+               color != nullptr && !color->GetConditions().IsNull()) {
+      text += fmt::format("a colour in {}", color->GetConditions()->GetAttribute(
+                                                "ColorSpaceDescription.Type", "no colour space"));
+    } else {
+      text += fmt::format("a {}", attribute->GetType().substr(3));  // without "VEX"
+    }
+  }
+  return text;
+}
+
+}  // namespace Aldermoor::Tool

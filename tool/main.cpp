@@ -1,0 +1,158 @@
+#include <cerrno>
+#include <csignal>
+#include <exception>
+#include <iostream>
+#include <string>
+#include <utility>
+#include <vector>
+
+#include <CLI/CLI.hpp>
+#include <fcntl.h>
+#include <fmt/format.h>
+#include <unistd.h>
+
+#include "aldermoor/version.h"
+#include "aldermoor/vexdoc/xmlplatform.h"
+
+#include "command.h"
+#include "diagnostics.h"
+#include "output.h"
+
+namespace Aldermoor::Tool {
+namespace {
+
+struct CommandEntry {
+  const char* name;
+  const char* summary;
+  const char* examples;
+  std::unique_ptr<Command> (*make)();
+};
+
+constexpr CommandEntry kCommands[] = {
+    {"info", "Show what documents hold",
+     "  aldermoor info chart.xml\n"
+     "  aldermoor info --format json *.xml\n",
+     &MakeInfoCommand},
+    {"color", "Compute the colour of every sample",
+     "  aldermoor color chart.xml\n"
+     "  aldermoor color chart.xml --space CIEXYZ --illuminant 6500K --observer TenDegree\n"
+     "  aldermoor color chart.xml --illuminant @lamps.xml:Booth/TL84 --format csv\n"
+     "  aldermoor color chart.xml --set Ramp --sample \"Cyan 50\" --format json\n"
+     "  aldermoor color - --format csv --output chart.csv < chart.xml\n",
+     &MakeColorCommand},
+};
+
+constexpr const char* kExitStatusText =
+    "Exit status:\n"
+    "  0  everything was done\n"
+    "  1  some samples failed, or no sample matched\n"
+    "  2  wrong usage; nothing was computed\n"
+    "  3  an input could not be read; the others were processed\n"
+    "  4  the output could not be written\n";
+
+/// Keeps a file that is opened later from being taken for a standard stream that the caller has
+/// closed.  The wrong direction makes every use of such a stream fail as if it were still closed.
+void OccupyClosedStandardStreams() {
+  for (int fd = STDIN_FILENO; fd <= STDERR_FILENO; ++fd) {
+    if (fcntl(fd, F_GETFD) == -1 && errno == EBADF &&
+        open("/dev/null", fd == STDIN_FILENO ? O_WRONLY : O_RDONLY) == -1) {
+      _exit(static_cast<int>(ExitStatus::kNotWritten));
+    }
+  }
+}
+
+void Print(const std::string& text) {
+  Output output(kStandardStream);
+  output.Write(text);
+  output.Commit();
+}
+
+using Commands = std::vector<std::pair<CLI::App*, std::unique_ptr<Command>>>;
+
+Commands AddCommands(CLI::App& app) {
+  Commands commands;
+  for (const CommandEntry& entry : kCommands) {
+    CLI::App* const subcommand = app.add_subcommand(entry.name, entry.summary);
+    subcommand->footer(fmt::format("Examples:\n{}\n{}", entry.examples, kExitStatusText));
+    std::unique_ptr<Command> command = entry.make();
+    command->AddOptions(*subcommand);
+    commands.emplace_back(subcommand, std::move(command));
+  }
+  return commands;
+}
+
+ExitStatus FailUsage(const CLI::App& app, const std::string& message) {
+  const auto selected = app.get_subcommands();
+  Report(message);
+  Report(fmt::format("'aldermoor {}--help' tells how it is used",
+                     selected.empty() ? "" : selected.front()->get_name() + " "));
+  return ExitStatus::kUsage;
+}
+
+ExitStatus RunSelected(const CLI::App& app, const Commands& commands) {
+  for (const auto& [subcommand, command] : commands) {
+    if (subcommand->parsed()) {
+      const Vexdoc::XMLPlatform platform;
+      return command->Run();
+    }
+  }
+  Print(app.help());
+  return ExitStatus::kUsage;
+}
+
+ExitStatus ParseAndRun(CLI::App& app, const Commands& commands, int argc, char** argv) {
+  try {
+    app.parse(argc, argv);
+  } catch (const CLI::CallForHelp&) {
+    Print(app.help());
+    return ExitStatus::kDone;
+  } catch (const CLI::CallForVersion& version) {
+    Print(std::string(version.what()) + "\n");
+    return ExitStatus::kDone;
+  } catch (const CLI::ParseError& e) {
+    return FailUsage(app, e.what());
+  }
+  try {
+    return RunSelected(app, commands);
+  } catch (const UsageError& e) {
+    return FailUsage(app, e.what());
+  }
+}
+
+ExitStatus Main(int argc, char** argv) {
+  try {
+    CLI::App app("Colour-measurement documents on the command line", "aldermoor");
+    app.set_version_flag("--version", "aldermoor " ALDERMOOR_VERSION);
+    // With one at most, a file may bear the name of a subcommand.
+    app.require_subcommand(0, 1);
+    app.footer(fmt::format("'aldermoor COMMAND --help' shows options and examples.\n\n{}",
+                           kExitStatusText));
+    const Commands commands = AddCommands(app);
+    return ParseAndRun(app, commands, argc, argv);
+  } catch (const InputError& e) {
+    Report(e.what());
+    return ExitStatus::kUnreadable;
+  } catch (const OutputError& e) {
+    if (!e.IsBrokenPipe()) {  // the reader has seen enough
+      Report(e.what());
+    }
+    return ExitStatus::kNotWritten;
+  } catch (const std::exception& e) {
+    Report(fmt::format("unexpected failure: {}", e.what()));
+    return ExitStatus::kSomeFailed;
+  }
+}
+
+}  // namespace
+}  // namespace Aldermoor::Tool
+
+int main(int argc, char** argv) {
+  Aldermoor::Tool::OccupyClosedStandardStreams();
+  std::signal(SIGPIPE, SIG_IGN);  // a broken pipe is a failed write
+  // The XML parser may print warnings to std::cout; they must not get between the results, which
+  // do not go through it.
+  std::cout.rdbuf(std::cerr.rdbuf());
+  const auto status = Aldermoor::Tool::Main(argc, argv);
+  std::cout.rdbuf(nullptr);
+  return static_cast<int>(status);
+}

@@ -1,0 +1,56 @@
+#ifndef ALDERMOOR_TOOL_OUTPUT_H
+#define ALDERMOOR_TOOL_OUTPUT_H
+
+#include <stdexcept>
+#include <string>
+#include <string_view>
+
+namespace Aldermoor::Tool {
+
+/// The name that stands for standard input or standard output.
+inline constexpr const char* kStandardStream = "-";
+
+/// The output cannot be written.
+class OutputError : public std::runtime_error {
+ public:
+  OutputError(const std::string& target, int error);
+  /// Whether the reader of a pipe has gone away.
+  bool IsBrokenPipe() const { return broken_pipe_; }
+
+ private:
+  bool broken_pipe_;
+};
+
+/// Where results go: standard output, or a file that is complete or not there at all.
+///
+/// A file is written beside its target and takes its place in Commit; without it, whatever was
+/// there stays.  Devices and pipes are written directly.  Throws: OutputError.
+class Output {
+ public:
+  /// Opens at once, so that a path that cannot be written fails before the work.
+  explicit Output(const std::string& path);
+  Output(const Output&) = delete;
+  Output& operator=(const Output&) = delete;
+  ~Output();
+
+  void Write(std::string_view text);
+  /// Nothing may be written afterwards.
+  void Commit();
+
+ private:
+  void Open(const std::string& path);
+  void OpenTemporary(unsigned int mode);
+  void Flush();
+  [[noreturn]] void Fail(int error) const;
+
+  std::string shown_;      // the name in messages
+  std::string target_;     // what the temporary is renamed to
+  std::string temporary_;  // empty if there is none
+  int descriptor_ = -1;
+  bool owned_ = false;
+  std::string buffer_;
+};
+
+}  // namespace Aldermoor::Tool
+
+#endif  // ALDERMOOR_TOOL_OUTPUT_H

@@ -1,0 +1,46 @@
+#ifndef ALDERMOOR_TOOL_VOCABULARY_H
+#define ALDERMOOR_TOOL_VOCABULARY_H
+
+#include <optional>
+#include <string>
+#include <string_view>
+#include <vector>
+
+/// The words of the conditions.  The library keeps its default for a word that it does not know,
+/// so a misspelt one is found here or never.
+namespace Aldermoor::Tool {
+
+inline const std::string kTypeKey = "ColorSpaceDescription.Type";
+inline const std::string kIlluminationKey = "Colorimetric.Illumination";
+inline const std::string kObserverKey = "Colorimetric.Observer";
+inline const std::string kWhiteBaseKey = "Colorimetric.WhiteBase";
+inline const std::string kCustomKey = "CustomCondition";
+inline const std::string kEnable = "Enable";
+inline const std::string kUserdefined = "Userdefined";
+
+/// The words of a list that is separated by blanks.
+std::vector<std::string_view> SplitWords(std::string_view list);
+
+/// Throws: UsageError that names `what` and lists `words`, if `word` is none of them.
+void CheckWord(const std::string& what, const std::string& word,
+               const std::vector<std::string_view>& words);
+
+/// The words for `key`, blanks between them; nothing for a key outside the vocabulary.  The
+/// illuminants are those without a form of their own.
+std::optional<std::string_view> WordsFor(const std::string& key);
+/// Every key of the vocabulary.
+std::vector<std::string_view> AllKeys();
+
+/// The value of "Colorimetric.Illumination" for a word: itself, or that of a daylight as "6500K"
+/// or "Dxx, Temperature:6500".  A temperature for which daylight is not defined is reported.
+/// Throws: UsageError, with `what` in the text.
+std::string IlluminationValue(const std::string& what, const std::string& word);
+
+/// Checks `value` against the words of `key`, which belongs to the vocabulary, and returns it in
+/// the form that the library reads.  Throws: UsageError.
+std::string ConditionValue(const std::string& what, const std::string& key,
+                           const std::string& value);
+
+}  // namespace Aldermoor::Tool
+
+#endif  // ALDERMOOR_TOOL_VOCABULARY_H
