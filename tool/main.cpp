@@ -36,7 +36,7 @@ constexpr CommandEntry kCommands[] = {
     {"color", "Compute the colour of every sample",
      "  aldermoor color chart.xml\n"
      "  aldermoor color chart.xml --space CIEXYZ --illuminant 6500K --observer TenDegree\n"
-     "  aldermoor color chart.xml --illuminant @lamps.xml:Booth/TL84 --format csv\n"
+     "  aldermoor color chart.xml --illuminant @lamps.xml:Booth/daylight --format csv\n"
      "  aldermoor color chart.xml --set Ramp --sample \"Cyan 50\" --format json\n"
      "  aldermoor color - --format csv --output chart.csv < chart.xml\n",
      &MakeColorCommand},
