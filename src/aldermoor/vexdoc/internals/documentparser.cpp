@@ -19,6 +19,7 @@ DocumentParser::DocumentParser(ParseBudget& budget) : XercesDOMParser(nullptr, &
   setCreateEntityReferenceNodes(false);
   // Guards; none of them changes what a harmless document looks like.
   setLoadExternalDTD(false);
+  getScanner()->setEntityHandler(this);  // without it the scanner opens entities by itself
   limits_.setEntityExpansionLimit(kMostExpansions);
   setSecurityManager(&limits_);
 }

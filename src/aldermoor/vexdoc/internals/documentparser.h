@@ -18,7 +18,7 @@ namespace Aldermoor::Vexdoc::Internals {
 /// - A document type is never validated against: with validation on it is a failure at once, so
 ///   that the second parse, without, reads the document.
 /// - Internal entities are held to 4,096 characters each and 1,000 expansions in all, parameter
-///   entities are not read, and a document type makes at most 10,000 declarations.
+///   entities are not read, and a document type makes at most 1,000 declarations.
 /// - Memory is held to the budget.
 /// Throws: VexXMLParseException with file, line and column; xercesc::OutOfMemoryException beyond
 /// the budget.
@@ -28,7 +28,7 @@ class DocumentParser : public xercesc::XercesDOMParser {
   static constexpr XMLSize_t kMostElementNames = 32768;
   static constexpr XMLSize_t kLongestEntity = 4096;
   static constexpr XMLSize_t kMostExpansions = 1000;
-  static constexpr unsigned int kMostDeclarations = 10000;
+  static constexpr unsigned int kMostDeclarations = 1000;
 
   explicit DocumentParser(ParseBudget& budget);
 
