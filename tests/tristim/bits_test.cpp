@@ -20,12 +20,11 @@ using Internals::TristimCalculator;
 /// Linear congruential generator of Numerical Recipes; the same numbers everywhere.
 class Lcg {
  public:
-  /// 0 to below 1, in steps of 2^-16.
-  float Next() {
+  /// In steps of 2^-16 of the range.
+  float Next(float low = 0.0F, float high = 1.0F) {
     state_ = state_ * 1664525U + 1013904223U;
-    return static_cast<float>(state_ >> 16) / 65536.0F;
+    return low + (high - low) * (static_cast<float>(state_ >> 16) / 65536.0F);
   }
-  float Next(float low, float high) { return low + (high - low) * Next(); }
 
  private:
   std::uint32_t state_ = 20260101U;
@@ -43,14 +42,11 @@ class Checksum {
         hash_ = (hash_ ^ ((bits >> shift) & 0xFFU)) * 1099511628211ULL;
       }
     }
-    ++count_;
   }
   std::uint64_t Get() const { return hash_; }
-  int Count() const { return count_; }
 
  private:
   std::uint64_t hash_ = 14695981039346656037ULL;
-  int count_ = 0;
 };
 
 std::vector<HXMeasureConditions> AllLights(Lcg& random) {
@@ -92,7 +88,6 @@ TEST(BitsTest, OfAllColorSpacesFromSpectra) {
       }
     }
   }
-  EXPECT_EQ(checksum.Count(), 50 * 20 * 13);
   EXPECT_EQ(checksum.Get(), 0x9C0560E1D4F8E71ULL);
 }
 
@@ -124,7 +119,6 @@ TEST(BitsTest, OfAllConversionsOfVectors) {
       }
     }
   }
-  EXPECT_EQ(checksum.Count(), 50 * 14 * 20 * 2);
   EXPECT_EQ(checksum.Get(), 0xFEFDD023194A4D2BULL);
 }
 

@@ -1,13 +1,19 @@
 #ifndef ALDERMOOR_TESTS_TRISTIM_SUPPORT_H
 #define ALDERMOOR_TESTS_TRISTIM_SUPPORT_H
 
+#include <array>
 #include <string>
 
 #include "aldermoor/tristim/hxcolorvector.h"
 #include "aldermoor/tristim/hxspectrum.h"
 #include "aldermoor/tristim/internals/vocabulary.h"
 
+#include "tests/tolerances.h"
+#include "tests/utilities/messageof.h"
+
 namespace Aldermoor::Tristim::Tests {
+
+using Aldermoor::Tests::MessageOf;
 
 inline HXMeasureConditions Conditions(const std::string& illumination,
                                       const std::string& observer = "TwoDegree",
@@ -29,15 +35,17 @@ inline HXSpectrum Flat(float value, const HXMeasureConditions& conditions = {}) 
   return HXSpectrum(bands.data(), conditions);
 }
 
-/// The message of the exception of type `E` that `action` throws; other types pass through.
-template <class E, class Action>
-std::string MessageOf(Action action) {
-  try {
-    action();
-  } catch (const E& e) {
-    return e.what();
+inline ::testing::AssertionResult Near(float actual, double expected, double tolerance) {
+  return Aldermoor::Tests::Within(static_cast<double>(actual), expected, tolerance);
+}
+
+/// Of the first three channels.
+template <std::size_t N>
+void ExpectNear(const std::array<float, N>& actual, const std::array<double, 3>& expected,
+                double tolerance = Aldermoor::Tests::kSinglePrecisionFormula) {
+  for (std::size_t i = 0; i < 3; ++i) {
+    EXPECT_TRUE(Near(actual[i], expected[i], tolerance)) << "channel " << i;
   }
-  return "nothing was thrown";
 }
 
 }  // namespace Aldermoor::Tristim::Tests

@@ -5,7 +5,6 @@
 #include "aldermoor/tristim/internals/tristimfilter.h"
 #include "aldermoor/tristim/tristimexception.h"
 
-#include "tests/tolerances.h"
 #include "tests/tristim/support.h"
 
 // First and last values are the published ones.  The sums were made from the published decimals in
@@ -50,6 +49,10 @@ constexpr TableCase kIlluminants[] = {
     {IlluminationType::kFluorescent, 10, 5, 780, 380, 1.11F, 0.09F, 615.56, 20353.16},
     {IlluminationType::kFluorescent, 11, 5, 780, 380, 0.91F, 0.09F, 594.08, 20885.38},
     {IlluminationType::kFluorescent, 12, 5, 780, 380, 0.96F, 0.05F, 566.76, 21693.99},
+    // F2, F7 and F11 have types of their own, too.
+    {8, 0, 5, 780, 380, 1.18F, 0.27F, 594.5, 19989.08},
+    {9, 0, 5, 780, 380, 2.56F, 0.81F, 788.9, 26185.59},
+    {10, 0, 5, 780, 380, 0.91F, 0.09F, 594.08, 20885.38},
 };
 
 constexpr TableCase kObservers[] = {
@@ -81,45 +84,33 @@ void ExpectTable(const StandardFilter& filter, const TableCase& table) {
   EXPECT_TRUE(Within(weighted, table.weighted_sum, rounding * count));
 }
 
-class IlluminantTableTest : public ::testing::TestWithParam<TableCase> {};
-
-TEST_P(IlluminantTableTest, HoldsThePublishedValues) {
-  HXIllumination illumination(GetParam().type);
-  illumination.SetFluorescence(static_cast<std::uint8_t>(GetParam().number));
-  ExpectTable(TristimFilter::GetIlluFilter(illumination), GetParam());
+HXIllumination Illumination(int type, int number = 0) {
+  HXIllumination illumination(type);
+  illumination.SetFluorescence(static_cast<std::uint8_t>(number));
+  return illumination;
 }
 
-INSTANTIATE_TEST_SUITE_P(All, IlluminantTableTest, ::testing::ValuesIn(kIlluminants));
-
-class ObserverTableTest : public ::testing::TestWithParam<TableCase> {};
-
-TEST_P(ObserverTableTest, HoldsThePublishedValues) {
-  const auto axis = static_cast<unsigned short>(GetParam().number);
-  ExpectTable(TristimFilter::GetObserverFilter(GetParam().type, axis), GetParam());
-}
-
-INSTANTIATE_TEST_SUITE_P(All, ObserverTableTest, ::testing::ValuesIn(kObservers));
-
-TEST(TristimFilterTest, TheNamedFluorescentsAreThoseWithTheirNumbers) {
-  constexpr std::pair<int, std::uint8_t> kNamed[] = {{8, 2}, {9, 7}, {10, 11}};
-  for (const auto& [type, number] : kNamed) {
-    HXIllumination numbered(IlluminationType::kFluorescent);
-    numbered.SetFluorescence(number);
-    const StandardFilter first = TristimFilter::GetIlluFilter(HXIllumination(type));
-    const StandardFilter second = TristimFilter::GetIlluFilter(numbered);
-    EXPECT_TRUE(std::equal(first.GetFilter(), first.GetFilter() + 81, second.GetFilter()));
+TEST(TablesTest, HoldThePublishedValues) {
+  for (const TableCase& table : kIlluminants) {
+    SCOPED_TRACE(::testing::Message() << "illuminant " << table.type << ", " << table.number);
+    ExpectTable(TristimFilter::GetIlluFilter(Illumination(table.type, table.number)), table);
+  }
+  for (const TableCase& table : kObservers) {
+    SCOPED_TRACE(::testing::Message() << "observer " << table.type << ", axis " << table.number);
+    const auto axis = static_cast<unsigned short>(table.number);
+    ExpectTable(TristimFilter::GetObserverFilter(table.type, axis), table);
   }
 }
 
-TEST(TristimFilterTest, RefusesWhatHasNoTable) {
+TEST(TablesTest, WhatHasNoTableIsRefused) {
+  std::vector<HXIllumination> illuminations;
   for (const int type : {-2, -1, 7, 12, 13, 17}) {
-    EXPECT_EQ(
-        MessageOf<TristimException>([&] { TristimFilter::GetIlluFilter(HXIllumination(type)); }),
-        "Unsupported Illumination type");
+    illuminations.push_back(Illumination(type));
   }
   for (const int number : {0, 13, 255}) {
-    HXIllumination illumination(IlluminationType::kFluorescent);
-    illumination.SetFluorescence(static_cast<std::uint8_t>(number));
+    illuminations.push_back(Illumination(IlluminationType::kFluorescent, number));
+  }
+  for (const HXIllumination& illumination : illuminations) {
     EXPECT_EQ(MessageOf<TristimException>([&] { TristimFilter::GetIlluFilter(illumination); }),
               "Unsupported Illumination type");
   }

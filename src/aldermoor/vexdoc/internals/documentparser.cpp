@@ -17,7 +17,7 @@ DocumentParser::DocumentParser(ParseBudget& budget) : XercesDOMParser(nullptr, &
   setDoNamespaces(false);
   setErrorHandler(&reporter_);
   setCreateEntityReferenceNodes(false);
-  // Guards; none of them changes what a harmless document looks like.
+  // Guards; a document without a document type meets only those of memory and of depth.
   setLoadExternalDTD(false);
   getScanner()->setEntityHandler(this);  // without it the scanner opens entities by itself
   limits_.setEntityExpansionLimit(kMostExpansions);

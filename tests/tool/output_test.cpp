@@ -1,0 +1,81 @@
+#include <gtest/gtest.h>
+
+#include "toolrun.h"
+
+namespace Aldermoor::Tool {
+namespace {
+
+class OutputTest : public ToolTest {
+ protected:
+  OutputTest() {
+    WriteDocument("a.xml", "Set", SampleXml("gray", 0.5));
+    WriteFile("broken.xml", "<VEX Version='1.0'>\n  <Name></Nome></VEX>");
+  }
+};
+
+TEST_F(OutputTest, StandardInputAndOutputTakeTheDash) {
+  const Result file = Run("color a.xml --format csv");
+  const Result pipe = Shell("cat a.xml | aldermoor color - --format csv --output -");
+  EXPECT_EQ(pipe.status, 0) << pipe.err;
+  EXPECT_EQ(pipe.out, file.out);
+  EXPECT_NE(file.out, "");
+}
+
+TEST_F(OutputTest, UnreadableInputIsReportedWithItsPlaceAndTheOthersGoOn) {
+  const Result result = Run("color broken.xml nix.xml . a.xml --sample nobody");
+  EXPECT_EQ(result.status, 3) << "counts more than the sample that is not there";
+  EXPECT_TRUE(Holds(result.err, "aldermoor: broken.xml:2:"));
+  EXPECT_TRUE(Holds(result.err, "nix.xml: No such file or directory"));
+  EXPECT_TRUE(Holds(result.err, ".: Is a directory"));
+  EXPECT_TRUE(Holds(result.err, "no sample 'nobody'"));
+  EXPECT_EQ(ParseCsv(Run("color broken.xml a.xml --format=csv").out).size(), 2U);
+  const Result stream = Shell("aldermoor color - < broken.xml");
+  EXPECT_EQ(stream.status, 3);
+  EXPECT_TRUE(Holds(stream.err, "<standard input>:2:"));
+}
+
+TEST_F(OutputTest, FileIsReplacedWholeOrNotAtAll) {
+  WriteFile("old.csv", "old");
+  EXPECT_EQ(Shell("ln -s old.csv link.csv; chmod 640 old.csv").status, 0);
+  EXPECT_EQ(Run("color broken.xml --output old.csv").status, 3);
+  EXPECT_EQ(ReadFile("old.csv"), "old");
+  // The limit of file size, in blocks of 512 or 1024 bytes, stands for a full disk.
+  const std::string many = "aldermoor color $(yes a.xml | head -200) --format csv --output old.csv";
+  const Result full = Shell("trap '' XFSZ; ulimit -f 1; " + many);
+  EXPECT_EQ(full.status, 4);
+  EXPECT_EQ(full.err, "aldermoor: old.csv cannot be written: File too large\n");
+  EXPECT_EQ(ReadFile("old.csv"), "old");
+  EXPECT_EQ(Run("color a.xml --output link.csv --format=csv").status, 0);
+  EXPECT_EQ(ReadFile("old.csv"), Run("color a.xml --format=csv").out);
+  EXPECT_EQ(Shell("test -L link.csv && stat -c %a old.csv").out, "640\n");
+  EXPECT_EQ(Shell("LC_ALL=C ls -A").out, "a.xml\nbroken.xml\nlink.csv\nold.csv\n");
+}
+
+TEST_F(OutputTest, FailingOutputIsAnError) {
+  for (const char* command : {"color a.xml", "info a.xml", "info --format json a.xml", "--help"}) {
+    const Result result = Shell(std::string("aldermoor ") + command + " > /dev/full");
+    EXPECT_EQ(result.status, 4) << command;
+    EXPECT_TRUE(Holds(result.err, "No space left on device"));
+  }
+  EXPECT_EQ(Run("color a.xml --output /dev/full").status, 4);
+  EXPECT_EQ(Shell("test -c /dev/full").status, 0) << "a device is written, not replaced";
+  EXPECT_EQ(Run("color a.xml --output nix/out").status, 4);
+  const Result closed = Shell("aldermoor color a.xml >&-");
+  EXPECT_EQ(closed.status, 4);
+  EXPECT_TRUE(Holds(closed.err, "standard output cannot be written"));
+}
+
+TEST_F(OutputTest, ReaderThatWentAwayEndsTheRunQuietly) {
+  const Result result = Shell("{ sleep 0.2; aldermoor color a.xml; echo $? > status; } | true");
+  EXPECT_EQ(ReadFile("status"), "4\n");
+  EXPECT_EQ(result.err, "");
+}
+
+TEST_F(OutputTest, ClosedStandardErrorDoesNotEndUpInTheOutput) {
+  EXPECT_EQ(Shell("aldermoor color broken.xml a.xml --output out.csv --format=csv 2>&-").status, 3);
+  EXPECT_EQ(ReadFile("out.csv").find("aldermoor:"), std::string::npos);
+  EXPECT_EQ(ReadFile("out.csv").find("file,set,sample"), 0U);
+}
+
+}  // namespace
+}  // namespace Aldermoor::Tool
