@@ -178,15 +178,18 @@ std::string Laughs(int levels, const std::string& laugh = "lol") {
 }
 
 constexpr char kExpansions[] = "more than '1000' entity expansions";
+constexpr char kLongEntity[] = "is longer than 4096 characters";
 constexpr char kMemory[] = "takes more memory";
 
 // The last ones are as small as shows a fault: larger texts would stop the test run.
 std::vector<Growth> GrowingTexts() {
   return {
-      {"bomb", Laughs(9), "&l9;", kExpansions},
-      {"bomb in an attribute", Laughs(9), "<a b='&l9;'/>", kExpansions},
+      {"bomb", Laughs(9), "&l9;", kLongEntity},
+      {"flat bomb", Laughs(2), Repeated("&l2;", 11), kExpansions},
+      {"flat bomb in an attribute", Laughs(2), "<a b='" + Repeated("&l2;", 11) + "'/>",
+       kExpansions},
       {"bomb in the default of an attribute",
-       Laughs(5, std::string(300, 'x')) + "<!ATTLIST a b CDATA '&l5;'>", "", kMemory},
+       Laughs(5, std::string(300, 'x')) + "<!ATTLIST a b CDATA '&l5;'>", "", kLongEntity},
       {"long default of an attribute", "<!ATTLIST a b CDATA '" + std::string(20000, 'x') + "'>",
        Repeated("<a/>", 3000), kMemory},
       {"many defaults of attributes", "<!ATTLIST a " + Numbered("b", " CDATA ''", 1000) + ">",

@@ -27,6 +27,7 @@ DocumentParser::DocumentParser(ParseBudget& budget) : XercesDOMParser(nullptr, &
 void DocumentParser::resetDocument() {
   depth_ = 0;
   declarations_ = 0;
+  entity_lengths_ = {{u"amp", 1}, {u"lt", 1}, {u"gt", 1}, {u"quot", 1}, {u"apos", 1}};
   XercesDOMParser::resetDocument();
 }
 
@@ -81,10 +82,12 @@ void DocumentParser::entityDecl(const xercesc::DTDEntityDecl& decl, bool is_para
     if (is_parameter_entity) {
       Fail("Parameter entity '" + ToNativeString(decl.getName()) + "' is not read");
     }
-    if (decl.getValueLen() > kLongestEntity) {
+    const XMLSize_t length = ExpandedLength(decl.getValue());
+    if (length > kLongestEntity) {
       Fail("Entity '" + ToNativeString(decl.getName()) + "' is longer than " +
            std::to_string(kLongestEntity) + " characters");
     }
+    entity_lengths_.emplace(decl.getName(), length);  // the first declaration of a name counts
   }
   XercesDOMParser::entityDecl(decl, is_parameter_entity, is_ignored);
 }
@@ -96,6 +99,32 @@ void DocumentParser::notationDecl(const xercesc::XMLNotationDecl& decl, bool is_
 
 xercesc::InputSource* DocumentParser::resolveEntity(xercesc::XMLResourceIdentifier* resource) {
   Fail("External entity '" + ToNativeString(resource->getSystemId()) + "' is not opened");
+}
+
+// With the entities that the text refers to, and those that they refer to.  The parser counts no
+// expansions in the default of an attribute, so none may be large.
+XMLSize_t DocumentParser::ExpandedLength(const XMLCh* text) {
+  XMLSize_t length = 0;
+  for (const XMLCh* c = text; *c != 0 && length <= kLongestEntity; ++c) {
+    ++length;
+    if (*c != u'&' || c[1] == u'#') {
+      continue;
+    }
+    const XMLCh* const name = c + 1;
+    while (*c != 0 && *c != u';') {
+      ++c;
+    }
+    const auto entity = entity_lengths_.find(std::u16string(name, c));
+    if (entity == entity_lengths_.end()) {
+      Fail("Entity '" + ToNativeString(std::u16string(name, c).c_str()) +
+           "' is not declared before another one refers to it");
+    }
+    length += entity->second;
+    if (*c == 0) {
+      break;
+    }
+  }
+  return length;
 }
 
 void DocumentParser::CountDeclaration() {

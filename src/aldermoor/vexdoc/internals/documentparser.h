@@ -1,6 +1,7 @@
 #ifndef ALDERMOOR_VEXDOC_INTERNALS_DOCUMENTPARSER_H
 #define ALDERMOOR_VEXDOC_INTERNALS_DOCUMENTPARSER_H
 
+#include <map>
 #include <string>
 
 #include <xercesc/parsers/XercesDOMParser.hpp>
@@ -17,8 +18,9 @@ namespace Aldermoor::Vexdoc::Internals {
 /// - Nothing but the source itself is opened; an external entity that is referred to is a failure.
 /// - A document type is never validated against: with validation on it is a failure at once, so
 ///   that the second parse, without, reads the document.
-/// - Internal entities are held to 4,096 characters each and 1,000 expansions in all, parameter
-///   entities are not read, and a document type makes at most 1,000 declarations.
+/// - Internal entities are held to 4,096 characters each, expanded, and 1,000 expansions in all;
+///   they refer to earlier ones only.  Parameter entities are not read, and a document type makes
+///   at most 1,000 declarations.
 /// - Memory is held to the budget.
 /// Throws: VexXMLParseException with file, line and column; xercesc::OutOfMemoryException beyond
 /// the budget.
@@ -51,6 +53,7 @@ class DocumentParser : public xercesc::XercesDOMParser {
   xercesc::InputSource* resolveEntity(xercesc::XMLResourceIdentifier* resource) override;
 
  private:
+  XMLSize_t ExpandedLength(const XMLCh* text);
   void CountDeclaration();
   [[noreturn]] void Fail(const std::string& reason);
 
@@ -58,6 +61,7 @@ class DocumentParser : public xercesc::XercesDOMParser {
   xercesc::SecurityManager limits_;
   unsigned int depth_ = 0;
   unsigned int declarations_ = 0;
+  std::map<std::u16string, XMLSize_t> entity_lengths_;  // with what they refer to, in characters
 };
 
 }  // namespace Aldermoor::Vexdoc::Internals
