@@ -43,8 +43,8 @@ TEST(ApiTest, ADocumentIsBuiltCopiedAndRearranged) {
   VEX document("lab");
   SampleSet set("inks");
   Sample sample("cyan");
-  sample.AddSampleAttribute(SmartPointer<Spectrum>(
-      new Spectrum(Measured(), std::vector<float>(36, 0.25F))));
+  sample.AddSampleAttribute(
+      SmartPointer<Spectrum>(new Spectrum(Measured(), std::vector<float>(36, 0.25F))));
   Recipe recipe(Conditions(), "basic", 1.5F, "paper", {{"blue", 3.0F}});
   sample.AddElement(recipe);
   set.AddSample(sample);

@@ -31,8 +31,8 @@ Vexdoc::Conditions Lab() {
 }
 
 float Lightness(const Vexdoc::Sample& sample) {
-  const auto color = DynamicCast<Vexdoc::ColorVector>(
-      sample.GetSampleAttribute("VEXColorVector", Lab(), false));
+  const auto color =
+      DynamicCast<Vexdoc::ColorVector>(sample.GetSampleAttribute("VEXColorVector", Lab(), false));
   std::printf("%s: %s %g\n", sample.GetName().c_str(), color->GetDatastore()[0].first.c_str(),
               static_cast<double>(color->GetDatastore()[0].second));
   return color->GetDatastore()[0].second;
