@@ -47,7 +47,8 @@ std::vector<Column> ChannelColumns(const Vexdoc::Conditions& request) {
 }
 
 // A stored colour can be converted to another colour space but not to another illuminant, and the
-// library hands it back under its own conditions.  Results in RGB and CMYK name none.
+// library hands it back under its own conditions.  Results in RGB and CMYK name none, and the
+// colour of a light is its own whatever illuminant is asked for.
 void CheckHoldsFor(const Vexdoc::Conditions& request, const Vexdoc::ColorVector& color) {
   const Vexdoc::Conditions& own = *color.GetConditions();
   const std::string space = own.GetAttribute(kTypeKey, "");
@@ -60,6 +61,10 @@ void CheckHoldsFor(const Vexdoc::Conditions& request, const Vexdoc::ColorVector&
       continue;
     }
     const auto found = own.GetAttributes().find(*key);
+    if (key == &kIlluminationKey && found != own.GetAttributes().end() &&
+        found->second == kEmission) {
+      continue;
+    }
     if (found == own.GetAttributes().end() || found->second != wanted->second) {
       throw std::runtime_error(
           fmt::format("the colour holds for {} '{}' and cannot be computed for '{}'", *key,

@@ -40,7 +40,7 @@ struct InputOptions {
     return status;
   }
 
-  /// Throws: UsageError if standard input is named more than once, `others` included.
+  /// Throws: UsageError if standard input is named more than once, `other` included.
   void CheckStandardInput(const std::string& other = "") const;
 
  private:
@@ -57,7 +57,7 @@ struct SampleFilter {
   bool IsSet() const { return set || sample; }
   bool TakesSet(const std::string& name) const { return !set || *set == name; }
   bool TakesSample(const std::string& name) const { return !sample || *sample == name; }
-  /// For messages: "no sample 'x' in set 'y'".
+  /// For messages: "no sample 'x' in a set 'y'".
   std::string NoMatchText() const;
 
   /// Calls `visit(set name, sample name, sample)` for every sample that passes, and returns how

@@ -17,6 +17,7 @@ inline const std::string kWhiteBaseKey = "Colorimetric.WhiteBase";
 inline const std::string kCustomKey = "CustomCondition";
 inline const std::string kEnable = "Enable";
 inline const std::string kUserdefined = "Userdefined";
+inline const std::string kEmission = "Emission";
 
 /// The words of a list that is separated by blanks.
 std::vector<std::string_view> SplitWords(std::string_view list);

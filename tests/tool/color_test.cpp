@@ -165,5 +165,18 @@ TEST_F(ColorTest, SampleThatCannotGiveTheColourIsNamedAndTheRestGoesOn) {
   EXPECT_NEAR(ToFloat(polar[1][4]), 26.5651F, 1e-3F);
 }
 
+TEST_F(ColorTest, LightHasItsOwnColourWhateverIlluminantIsAskedFor) {
+  WriteDocument("light.xml", "Set", SampleXml("lamp", 1.0));
+  std::string text = ReadFile("light.xml");
+  const std::string mark = "<Attribute ";
+  text.insert(text.find(mark),
+              "<Attribute Name=\"Colorimetric.Illumination\">Emission</Attribute>");
+  WriteFile("light.xml", text);
+  const auto asked = Csv("light.xml --space CIExyY --illuminant D50");
+  ASSERT_EQ(asked.size(), 2U);
+  EXPECT_NEAR(ToFloat(asked[1][2]), 1.0F / 3.0F, 1e-3F);
+  EXPECT_EQ(asked, Csv("light.xml --space CIExyY --illuminant Emission"));
+}
+
 }  // namespace
 }  // namespace Aldermoor::Tool

@@ -229,5 +229,21 @@ TEST(TristimCalculatorTest, TheThreeDeltaFormsAreOne) {
   }
 }
 
+TEST(TristimServiceTest, DifferencesArePolarAndFirstMinusSecond) {
+  constexpr const char* kSpaces[][2] = {
+      {"CIELab", "CIELCh"}, {"CIELuv", "CIELChuv"}, {"LABhx", "LCHhx"}};
+  for (const auto& [rectangular, polar] : kSpaces) {
+    const HXMeasureConditions conditions = Conditions("A", "TenDegree", rectangular);
+    const HXColorVector delta = TristimService::GetDeltaVector(
+        HXColorVector(60.0F, 6.0F, 8.0F, conditions), HXColorVector(50.0F, 3.0F, 4.0F, conditions));
+    EXPECT_EQ(delta[0], 10.0F);
+    EXPECT_EQ(delta[1], 5.0F);
+    EXPECT_TRUE(delta.GetMeasureConditions() == Conditions("A", "TenDegree", polar)) << polar;
+  }
+  const HXColorVector xyz(1.0F, 2.0F, 3.0F, InSpace("CIEXYZ"));
+  EXPECT_EQ(MessageOf<TristimException>([&] { TristimService::GetDeltaVector(xyz, xyz); }),
+            "TristimCalculator");
+}
+
 }  // namespace
 }  // namespace Aldermoor::Tristim::Tests

@@ -55,8 +55,8 @@ enum class DensityFilterMode : std::int32_t {
   Auto = 5
 };
 
-/// Says under what a colorimetric value is to be read: illuminant, observer, white, colour space
-/// and so on.  The typed twin of the conditions of a document, whose keys and words it speaks.
+/// What a colorimetric value refers to: illuminant, observer, white, colour space and so on.  The
+/// typed twin of the conditions of a document, whose keys and words it speaks.
 ///
 /// Defaults: D65, two-degree, white base automatic, CIELab, absolute vector, no filter.
 /// Grid: always 36 points from 380 nm to 730 nm; the three keys of the grid can be read, and

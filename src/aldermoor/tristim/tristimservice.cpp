@@ -98,6 +98,20 @@ constexpr VectorRow kVectorRows[] = {
     {Words::kRGB, Words::kCIELab, RgbToLab},
 };
 
+using Delta = bool (*)(const HXColorVector& first, const HXColorVector& second, HXColorVector& out);
+
+struct DeltaRow {
+  std::string_view from;
+  Delta run;
+  const char* to;
+};
+
+constexpr DeltaRow kDeltaRows[] = {
+    {Words::kCIELab, Calculator::GetVector_DeltaCIELCH_ab, Words::kCIELCh},
+    {Words::kCIELuv, Calculator::GetVector_CIELCH_uv, Words::kCIELChuv},
+    {Words::kLABhx, Calculator::GetVector_LCHhx_delta, Words::kLCHhx},
+};
+
 FromSpectrum FindWay(std::string_view color_space) {
   for (const SpectrumRow& row : kSpectrumRows) {
     if (row.color_space == color_space) {
@@ -159,6 +173,25 @@ HXColorVector TristimService::GetVector(const HXColorVector& vector,
   return {out[0], out[1], out[2], conditions};
 }
 ALDERMOOR_FRAME(Aldermoor::Tristim::TristimService::GetVector)
+
+HXColorVector TristimService::GetDeltaVector(const HXColorVector& first,
+                                             const HXColorVector& second) try {
+  HXMeasureConditions conditions = first.GetMeasureConditions();
+  for (const DeltaRow& row : kDeltaRows) {
+    if (row.from != first.GetMeasureConditions().GetColorSpace()) {
+      continue;
+    }
+    HXColorVector out;
+    if (row.run(first, second, out)) {
+      conditions.SetMeasureCondition(Words::kColorSpaceKey, row.to);
+      out.SetMeasureConditions(conditions);
+      return out;
+    }
+  }
+  throw TristimException(kCalculatorFailed,
+                         ALDERMOOR_HERE(Aldermoor::Tristim::TristimService::GetDeltaVector));
+}
+ALDERMOOR_FRAME(Aldermoor::Tristim::TristimService::GetDeltaVector)
 
 const std::vector<std::string>& TristimService::GetSupportedValues(std::string_view key) try {
   return HXMeasureConditions::GetSupportedValues(key);

@@ -29,6 +29,11 @@ class TristimService {
   /// Throws: TristimException for a pair of colour spaces without a way between them.
   static HXColorVector GetVector(const HXColorVector& vector, const std::string& colorSpace);
 
+  /// Differences of lightness, chroma and hue, `first` minus `second`, for two vectors in the
+  /// colour space of `first`: "CIELab", "CIELuv" or "LABhx".  The result is in its polar form.
+  /// Throws: TristimException for any other colour space.
+  static HXColorVector GetDeltaVector(const HXColorVector& first, const HXColorVector& second);
+
   /// As HXMeasureConditions::GetSupportedValues.
   static const std::vector<std::string>& GetSupportedValues(std::string_view key);
 };

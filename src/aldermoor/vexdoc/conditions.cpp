@@ -95,10 +95,12 @@ std::string Conditions::GetAttribute(const std::string& key,
 }
 
 void Conditions::RemoveAttribute(const std::string& key) {
+  NoteChange();
   attributes_.erase(key);
 }
 
 void Conditions::RemoveAllAttributes() {
+  NoteChange();
   attributes_.clear();
 }
 

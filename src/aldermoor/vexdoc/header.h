@@ -79,7 +79,11 @@ class ALDERMOOR_EXPORT Header : public DeprecatedVexHeaderInterface<0> {
   virtual void SetName(const std::string& name);
 
  protected:
-  void StoreParent(Header* parent) { parent_ = parent; }
+  /// Moves this element, of class `Element`, from its current parent to `target`, both of class
+  /// `Parent`.  Only a current parent can give an element the SmartPointer to itself, so nothing
+  /// happens without one, nor for another target than such a parent.
+  template <class Parent, class Element>
+  void MoveToParent(Element& element, Header* target);
 
  private:
   friend class Internals::DocumentAccess;

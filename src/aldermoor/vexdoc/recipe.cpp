@@ -63,9 +63,8 @@ bool Recipe::Equals(const SampleAttribute& other) const try {
 }
 ALDERMOOR_FRAME(Aldermoor::Vexdoc::Recipe::Equals)
 
-void Recipe::SetAssortmentName(const std::string& name) {
-  assortment_name_ = name;
-}
+void Recipe::SetAssortmentName(const std::string& name) try { assortment_name_ = name; }
+ALDERMOOR_FRAME(Aldermoor::Vexdoc::Recipe::SetAssortmentName)
 
 std::string Recipe::GetAssortmentName() const {
   return assortment_name_;
@@ -79,17 +78,15 @@ float Recipe::GetThickness() const {
   return thickness_;
 }
 
-void Recipe::SetSubstrateLinkName(const std::string& name) {
-  substrate_link_name_ = name;
-}
+void Recipe::SetSubstrateLinkName(const std::string& name) try { substrate_link_name_ = name; }
+ALDERMOOR_FRAME(Aldermoor::Vexdoc::Recipe::SetSubstrateLinkName)
 
 std::string Recipe::GetSubstrateLinkName() const {
   return substrate_link_name_;
 }
 
-void Recipe::SetComponents(const Components& components) {
-  components_ = components;
-}
+void Recipe::SetComponents(const Components& components) try { components_ = components; }
+ALDERMOOR_FRAME(Aldermoor::Vexdoc::Recipe::SetComponents)
 
 const Recipe::Components& Recipe::GetComponents() const {
   return components_;

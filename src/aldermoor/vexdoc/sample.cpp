@@ -89,9 +89,7 @@ SmartPointer<SampleAttribute> Sample::Compute(const std::string& type, const Con
 void Sample::RemoveAll() try { Clear(); }
 ALDERMOOR_FRAME(Aldermoor::Vexdoc::Sample::RemoveAll)
 
-void Sample::SetParent(Header* parent) try {
-  StoreParent(MovedToParent<SampleSet>(*this, GetParent(), parent));
-}
+void Sample::SetParent(Header* parent) try { MoveToParent<SampleSet>(*this, parent); }
 ALDERMOOR_FRAME(Aldermoor::Vexdoc::Sample::SetParent)
 
 void Sample::AcceptVisitor(ElementVisitor& visitor) try { visitor.VisitSample(*this); }

@@ -12,9 +12,7 @@ ALDERMOOR_FRAME(Aldermoor::Vexdoc::SampleAttribute::SampleAttribute)
 
 SampleAttribute::~SampleAttribute() = default;
 
-void SampleAttribute::SetParent(Header* parent) try {
-  StoreParent(MovedToParent<Sample>(*this, GetParent(), parent));
-}
+void SampleAttribute::SetParent(Header* parent) try { MoveToParent<Sample>(*this, parent); }
 ALDERMOOR_FRAME(Aldermoor::Vexdoc::SampleAttribute::SetParent)
 
 }  // namespace Aldermoor::Vexdoc

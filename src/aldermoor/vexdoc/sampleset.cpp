@@ -43,9 +43,7 @@ void SampleSet::SwapSample(const std::string& first, const std::string& second) 
 }
 ALDERMOOR_FRAME(Aldermoor::Vexdoc::SampleSet::SwapSample)
 
-void SampleSet::SetParent(Header* parent) try {
-  StoreParent(MovedToParent<VEX>(*this, GetParent(), parent));
-}
+void SampleSet::SetParent(Header* parent) try { MoveToParent<VEX>(*this, parent); }
 ALDERMOOR_FRAME(Aldermoor::Vexdoc::SampleSet::SetParent)
 
 void SampleSet::AcceptVisitor(ElementVisitor& visitor) try { visitor.VisitSampleSet(*this); }

@@ -34,7 +34,7 @@ class ALDERMOOR_EXPORT Spectrum : public AbstractSampleAttribute {
 
   /// For "VEXSpectrum" a copy, if `conditions` ask for nothing that this spectrum's do not hold;
   /// for "VEXColorVector" a colour in the colour space and under the illuminant and observer of
-  /// `conditions`, flagged as derived.  A spectrum is never recomputed for other conditions.
+  /// `conditions`, flagged as derived.
   /// Throws: ResourceNotAvailableException for everything else, and if the colour cannot be
   /// computed.
   Utilities::Tools::SmartPointer<SampleAttribute> TransformTo(

@@ -54,8 +54,13 @@ TEST(ConditionManagerTest, EqualConditionsAreOneBlockAndABlockIsFoundUnderItsPre
     EXPECT_TRUE(IsSame(Manager().GetOrCreateConditions(changed), block));
     EXPECT_FALSE(IsSame(Manager().GetOrCreateConditions(asked), block));
     EXPECT_EQ(Manager().GetConditionsCount(), others + 2U);
+    block->RemoveAttribute("manager");
+    EXPECT_TRUE(IsSame(Manager().GetOrCreateConditions(Conditions()), block));
+    block->AddAttribute("manager", "changed");
+    block->RemoveAllAttributes();
+    EXPECT_TRUE(IsSame(Manager().GetOrCreateConditions(Conditions()), block));
     Manager().RemoveConditions(block->GetID());
-    EXPECT_FALSE(IsSame(Manager().GetOrCreateConditions(changed), block));
+    EXPECT_FALSE(IsSame(Manager().GetOrCreateConditions(Conditions()), block));
     EXPECT_EQ(Manager().GetConditionsCount(), others + 2U);
   }
 }

@@ -1,4 +1,5 @@
 #include <functional>
+#include <thread>
 
 #include <gtest/gtest.h>
 #include <malloc.h>
@@ -290,6 +291,33 @@ TEST(UnreadableFileTest, IsToldByItsPath) {
   chmod(secret.c_str(), 0000);
   const Unprivileged scope;
   ExpectNotAccessable(secret);
+}
+
+// What is wanted a second time by the second parse has to be kept.
+TEST(PipeTest, ADocumentIsReadFromAPipeWithThePlacesOfItsFaults) {
+  const TemporaryDirectory directory;
+  const std::filesystem::path path = directory / "pipe.xml";
+  ASSERT_EQ(mkfifo(path.c_str(), 0600), 0);
+  VEX document;
+  const auto load = [&](const std::string& text) {
+    std::thread writer([&] { WriteFile(path, text); });
+    try {
+      LoadFile(document, path);
+    } catch (...) {
+      writer.join();
+      throw;
+    }
+    writer.join();
+  };
+  load("<!DOCTYPE VEX><VEX Version='1'><Name>" + std::string(200000, 'n') + "</Name></VEX>");
+  EXPECT_EQ(document.GetName().size(), 200000U);
+  try {
+    load("<VEX Version='1'>\n<Name>n</VEX>");
+    FAIL() << "nothing was thrown";
+  } catch (const VexXMLParseException& e) {
+    EXPECT_EQ(e.GetFile(), path.string());
+    EXPECT_EQ(e.GetLine(), 2U);
+  }
 }
 
 }  // namespace

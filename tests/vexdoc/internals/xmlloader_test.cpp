@@ -1,4 +1,5 @@
 #include <clocale>
+#include <cstdlib>
 
 #include <gtest/gtest.h>
 
@@ -27,11 +28,14 @@ TEST_P(LegalDocumentTest, GivesExactlyItsContentWhateverWasThereBeforeAndInEvery
   EXPECT_EQ(DocumentText(document), expected);
   const unsigned long count = ConditionManager::GetInstance().GetConditionsCount();
   const std::string saved = std::setlocale(LC_ALL, nullptr);
-  for (const char* name : {"C", "C.UTF-8", "de_DE.UTF-8", "de_DE.ISO-8859-1"}) {
-    if (std::setlocale(LC_ALL, name) != nullptr) {
-      LoadText(document, ReadFile(path));
-      EXPECT_EQ(DocumentText(document), expected) << name;
+  for (const char* name : {"C", "C.UTF-8", "de_DE.ISO-8859-1"}) {
+    // The build makes the locale that is no part of every system, and ctest names its place.
+    if (std::setlocale(LC_ALL, name) == nullptr) {
+      ASSERT_EQ(std::getenv("LOCPATH"), nullptr) << name;
+      continue;
     }
+    LoadText(document, ReadFile(path));
+    EXPECT_EQ(DocumentText(document), expected) << name;
   }
   std::setlocale(LC_ALL, saved.c_str());
   EXPECT_EQ(ConditionManager::GetInstance().GetConditionsCount(), count) << "blocks are shared";

@@ -11,8 +11,8 @@ class HXLab : public HXColorVector {
   HXLab() = default;
   HXLab(const HXLab&) = default;
   HXLab& operator=(const HXLab&) = default;
-  HXLab(const HXColorVector& vector)
-      : HXColorVector(vector) {}  // NOLINT(google-explicit-constructor)
+  // NOLINTNEXTLINE(google-explicit-constructor)
+  HXLab(const HXColorVector& vector) : HXColorVector(vector) {}
   HXLab& operator=(const HXColorVector& vector) {
     HXColorVector::operator=(vector);
     return *this;

@@ -11,8 +11,8 @@ class HXLCh : public HXColorVector {
   HXLCh() = default;
   HXLCh(const HXLCh&) = default;
   HXLCh& operator=(const HXLCh&) = default;
-  HXLCh(const HXColorVector& vector)
-      : HXColorVector(vector) {}  // NOLINT(google-explicit-constructor)
+  // NOLINTNEXTLINE(google-explicit-constructor)
+  HXLCh(const HXColorVector& vector) : HXColorVector(vector) {}
 };
 
 }  // namespace Aldermoor::Tristim::Internals

@@ -11,8 +11,8 @@ class HXXYZ : public HXColorVector {
   HXXYZ() = default;
   HXXYZ(const HXXYZ&) = default;
   HXXYZ& operator=(const HXXYZ&) = default;
-  HXXYZ(const HXColorVector& vector)
-      : HXColorVector(vector) {}  // NOLINT(google-explicit-constructor)
+  // NOLINTNEXTLINE(google-explicit-constructor)
+  HXXYZ(const HXColorVector& vector) : HXColorVector(vector) {}
 };
 
 }  // namespace Aldermoor::Tristim::Internals

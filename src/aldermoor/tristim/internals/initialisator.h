@@ -34,8 +34,8 @@ class Initialisator {
   std::map<std::string, std::vector<std::string>, std::less<>> supported_values_;
 };
 
-/// Base of HXMeasureConditions, without data: the first one ever built builds the tables, whatever
-/// the order in which static objects come to life.
+/// Base of HXMeasureConditions: its constructor makes the tables if nobody has yet, so that they
+/// are there for static objects too.
 ///
 /// Shared state: whether the tables are built.
 class GlobalStringInitialisator {

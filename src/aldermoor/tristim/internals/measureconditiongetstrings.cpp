@@ -4,6 +4,7 @@
 #include <cstdint>
 #include <iterator>
 #include <span>
+#include <stdexcept>
 #include <string_view>
 
 #include "aldermoor/tristim/internals/vocabulary.h"
@@ -174,6 +175,9 @@ HXIllumination MeasureConditionTranslator::GetIllumination(const std::string& va
     return illumination;
   }
   if (value.starts_with('D')) {
+    if (value.size() < std::size(Words::kDaylightPrefix) - 1) {
+      throw std::out_of_range(value + " is no illumination and too short for a daylight");
+    }
     HXIllumination illumination(Type::kDaylight);
     illumination.SetColorTemperature(NumberAt(value, std::size(Words::kDaylightPrefix) - 1));
     return illumination;

@@ -7,7 +7,7 @@
 
 namespace Aldermoor::Tristim::Internals {
 
-/// From a spectrum to tristimulus values and from there to every colour space.
+/// The colour spaces, from a spectrum and from each other.
 ///
 /// White follows the illuminant and observer in the conditions of the spectrum or vector.  All
 /// operations return false if a step below them fails: no paper white for the white base "Paper",

@@ -117,13 +117,16 @@ void Weightfactors::CalculateSum() {
   filter_sum_[1] = 100.0F;  // by definition; the weights add up to it within rounding
 }
 
-QuadraticCoefficients Weightfactors::GetLagrange2Coeff(unsigned short step, unsigned short offset) {
+QuadraticCoefficients Weightfactors::GetLagrange2Coeff(unsigned short step,
+                                                       unsigned short offset) try {
   return LagrangeQuadratic(step, offset);
 }
+ALDERMOOR_FRAME(Aldermoor::Tristim::Internals::Weightfactors::GetLagrange2Coeff)
 
-CubicCoefficients Weightfactors::GetLagrange3Coeff(unsigned short step, unsigned short offset) {
+CubicCoefficients Weightfactors::GetLagrange3Coeff(unsigned short step, unsigned short offset) try {
   return LagrangeCubic(step, offset);
 }
+ALDERMOOR_FRAME(Aldermoor::Tristim::Internals::Weightfactors::GetLagrange3Coeff)
 
 std::vector<float> Weightfactors::AdjustIlluminationVector(const StandardFilter& filter) try {
   std::vector<float> nodes;
@@ -149,6 +152,9 @@ ALDERMOOR_FRAME(Aldermoor::Tristim::Internals::Weightfactors::AdjustObserverVect
 
 void Weightfactors::BandpassCorrection() try {
   for (std::vector<float>& weights : weights_) {
+    if (weights.size() < 2) {
+      continue;  // nothing calculated yet
+    }
     const std::vector<float> o = weights;
     const std::size_t last = o.size() - 1;
     for (std::size_t i = 1; i < last; ++i) {

@@ -17,11 +17,12 @@ ALDERMOOR_EXPORT std::string MakeLocation(const char* prefix, const char* functi
 /// The search goes on behind the replacement, so that a token inside it stays as it is.  Behind a
 /// shorter replacement it goes on by the token's own length, and passes over a token that begins
 /// inside that stretch.
-std::string& ReplaceAll(const std::string& token, const std::string& replacement,
-                        std::string& text);
+ALDERMOOR_EXPORT std::string& ReplaceAll(const std::string& token, const std::string& replacement,
+                                         std::string& text);
 
 /// `pattern` with "%NAME%" (or whatever `token` says) filled in; for one-line use of ReplaceAll.
-std::string Filled(std::string pattern, const std::string& token, const std::string& replacement);
+ALDERMOOR_EXPORT std::string Filled(std::string pattern, const std::string& token,
+                                    const std::string& replacement);
 
 }  // namespace Aldermoor::Utilities::Exceptions
 

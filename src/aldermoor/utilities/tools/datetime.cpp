@@ -99,17 +99,14 @@ std::string DateTime::GetTime() const {
   return Format(time_format_);
 }
 
-void DateTime::SetDateTimeFormat(const std::string& format) {
-  date_time_format_ = format;
-}
+void DateTime::SetDateTimeFormat(const std::string& format) try { date_time_format_ = format; }
+ALDERMOOR_FRAME(Aldermoor::Utilities::Tools::DateTime::SetDateTimeFormat)
 
-void DateTime::SetDateFormat(const std::string& format) {
-  date_format_ = format;
-}
+void DateTime::SetDateFormat(const std::string& format) try { date_format_ = format; }
+ALDERMOOR_FRAME(Aldermoor::Utilities::Tools::DateTime::SetDateFormat)
 
-void DateTime::SetTimeFormat(const std::string& format) {
-  time_format_ = format;
-}
+void DateTime::SetTimeFormat(const std::string& format) try { time_format_ = format; }
+ALDERMOOR_FRAME(Aldermoor::Utilities::Tools::DateTime::SetTimeFormat)
 
 std::string DateTime::Format(const std::string& format) const try {
   if (time_ == 0) {

@@ -8,8 +8,8 @@
 
 namespace Aldermoor::Utilities::Tools {
 
-/// Converts through a std::stringstream with default formatting: floats have six significant
-/// digits, and text behind a number is ignored ("380nm" is 380).
+/// Writes `value` to a stream and reads it back as a `To`.  Floats become text of six digits, and
+/// of a text only the number at its beginning counts ("380nm" is 380).
 ///
 /// Throws: std::invalid_argument if no value of type `To` can be read from the beginning.
 template <class To, class From>

@@ -42,9 +42,9 @@ class ReferenceCount {
 
 /// Shared owner of a heap object; the object itself needs no counter.
 ///
-/// Ownership: the last SmartPointer deletes the object with a plain `delete` of the `T*`, so a `T`
-/// that is used through a base has a virtual destructor.  A family of copies belongs to one thread
-/// at a time.  Throws: NullPointerException from operator-> and operator* when empty.
+/// Ownership: the last SmartPointer deletes the object as a `T`, so bases need virtual destructors.
+/// The count has no lock: all pointers to one object stay in one thread.  Throws:
+/// NullPointerException from operator-> and operator* when empty.
 template <class T>
 class SmartPointer {
  public:
@@ -60,8 +60,8 @@ class SmartPointer {
     }
   }
 
-  /// Shares the object of `other` under another of its types, as after a cast: `pointee` is the
-  /// same object.  A null `pointee` gives an empty pointer and leaves the count alone.
+  /// Shares the object of `other` under another of its types, for casts: `pointee` is that object,
+  /// or null if the cast failed, which makes an empty pointer.
   template <class U>
   SmartPointer(T* pointee, const SmartPointer<U>& other) {
     if (pointee != nullptr && other.count_ != nullptr) {

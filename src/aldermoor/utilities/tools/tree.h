@@ -11,8 +11,8 @@ namespace Aldermoor::Utilities::Tools {
 
 /// A `T` with an ordered list of children, each a tree of its own.
 ///
-/// Ownership: children are shared.  A copy of a tree shares the children of its source and becomes
-/// their parent, so a child's parent is the node that was copied last.
+/// Ownership: children are shared, also between a tree and its copy.  The parent that such a child
+/// names is the younger of the two.
 template <class T>
 class Tree : public T {
  public:

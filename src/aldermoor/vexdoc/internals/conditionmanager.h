@@ -14,8 +14,8 @@ namespace Aldermoor::Vexdoc::Internals {
 
 /// The owner of the condition blocks that sample attributes share.
 ///
-/// Equal conditions are one block for all attributes of all documents in the process.  IDs are
-/// "1", "2", "3" and so on, and none is used twice.  The library itself never removes a block.
+/// Attributes of different documents share a block too, if their conditions are equal.  IDs count
+/// up from "1" and are never given out again.  Nothing in the library removes a block.
 /// Shared state: this one object, for the whole process and without a lock.
 class ConditionManager final : public Utilities::Patterns::Singleton<ConditionManager> {
  public:

@@ -42,7 +42,7 @@ Utilities::Tools::SmartPointer<Header> ElementFactory::CreateElement(
       return Element(kind.make());
     }
   }
-  return Element(new UnknownSampleAttribute(UnknownSampleAttribute::Data()));
+  return Element(new UnknownSampleAttribute(UnknownSampleAttribute::Data(new DataTree)));
 }
 ALDERMOOR_FRAME(Aldermoor::Vexdoc::Internals::ElementFactory::CreateElement)
 

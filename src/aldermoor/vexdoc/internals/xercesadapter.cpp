@@ -1,6 +1,8 @@
 #include "aldermoor/vexdoc/internals/xercesadapter.h"
 
 #include <array>
+#include <filesystem>
+#include <fstream>
 #include <istream>
 #include <vector>
 
@@ -61,11 +63,7 @@ XercesAdapter::XercesAdapter(VEX* document) : document_(document) {}
 void XercesAdapter::Load(std::istream& in) try {
   CheckPlatform();
   try {
-    const std::vector<char> bytes = ReadAll(in);
-    const xercesc::MemBufInputSource source(reinterpret_cast<const XMLByte*>(bytes.data()),
-                                            bytes.size(), kStreamName, false,
-                                            XMLPlatformUtils::fgMemoryManager);
-    LoadFrom(source, bytes.size());
+    LoadFrom(ReadAll(in), kStreamName);
   } catch (const XMLException& e) {
     throw VexException(
         Filled("An internal XML exception has occured while initializing XML:\n%REASON%",
@@ -91,9 +89,15 @@ void XercesAdapter::Load(File& file) try {
         ALDERMOOR_HERE(Aldermoor::Vexdoc::Internals::XercesAdapter::Load));
   }
   try {
-    const xercesc::LocalFileInputSource source(XMLChBuffer(path).Get(),
-                                               XMLPlatformUtils::fgMemoryManager);
-    LoadFrom(source, static_cast<std::size_t>(file.GetSize()));
+    if (std::filesystem::is_regular_file(path)) {
+      LoadFrom(
+          xercesc::LocalFileInputSource(XMLChBuffer(path).Get(), XMLPlatformUtils::fgMemoryManager),
+          static_cast<std::size_t>(file.GetSize()));
+    } else {
+      // A pipe gives its bytes once, and a second parse may want them again.
+      std::ifstream in(path, std::ios::binary);
+      LoadFrom(ReadAll(in), path);
+    }
   } catch (const XMLException& e) {
     throw VexException(
         Filled("An internal XML exception has occurred while loading XML:\n'%REASON%'", "%REASON%",
@@ -117,6 +121,13 @@ SmartPointer<XMLLoader> XercesAdapter::GetLoader(xercesc::DOMDocument* document)
   return SmartPointer<XMLLoader>(new XMLLoader(holder));
 }
 ALDERMOOR_FRAME(Aldermoor::Vexdoc::Internals::XercesAdapter::GetLoader)
+
+void XercesAdapter::LoadFrom(const std::vector<char>& bytes, const std::string& name) {
+  LoadFrom(
+      xercesc::MemBufInputSource(reinterpret_cast<const XMLByte*>(bytes.data()), bytes.size(),
+                                 XMLChBuffer(name).Get(), false, XMLPlatformUtils::fgMemoryManager),
+      bytes.size());
+}
 
 void XercesAdapter::LoadFrom(const xercesc::InputSource& source, std::size_t bytes) {
   ParseBudget budget(bytes);

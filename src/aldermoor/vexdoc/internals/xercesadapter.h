@@ -2,6 +2,8 @@
 #define ALDERMOOR_VEXDOC_INTERNALS_XERCESADAPTER_H
 
 #include <cstddef>
+#include <string>
+#include <vector>
 
 #include <xercesc/util/XercesDefs.hpp>
 
@@ -37,6 +39,8 @@ class XercesAdapter : public XMLParserAdapter {
   static Utilities::Tools::SmartPointer<XMLLoader> GetLoader(xercesc::DOMDocument* document);
 
  private:
+  // From memory; failures name the source by `name`.
+  void LoadFrom(const std::vector<char>& bytes, const std::string& name);
   // `bytes` is the size of the source.
   void LoadFrom(const xercesc::InputSource& source, std::size_t bytes);
 

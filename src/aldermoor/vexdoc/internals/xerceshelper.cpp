@@ -2,6 +2,7 @@
 
 #include <array>
 #include <charconv>
+#include <locale>
 #include <sstream>
 #include <system_error>
 
@@ -80,6 +81,7 @@ float ReadFloat(const XMLCh* text) {
     }
   }
   std::istringstream stream(ToNativeString(text));
+  stream.imbue(std::locale::classic());  // a file means the same whatever locale is in force
   float value = 0.0F;
   stream >> value;
   return value;

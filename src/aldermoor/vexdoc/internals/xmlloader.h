@@ -15,9 +15,9 @@ namespace Aldermoor::Vexdoc::Internals {
 
 /// Builds a new document from the DOM of one in the current dialect.
 ///
-/// An empty element accepts the loader, and its Visit operation fills it from the node on which
-/// the loader stands.  Condition blocks are read first and given to the ConditionManager; links
-/// are translated from the file's IDs to those of the manager.
+/// The Visit operation of an element's class reads its content from the current node.  Condition
+/// blocks come first and go to the ConditionManager, and links are translated from the IDs of the
+/// file to those of the manager.
 /// Throws: VexException, VexParseException, ResourceNotAvailableException, InvalidArgumentException
 /// and NullPointerException for content that breaks the rules of the format.
 class XMLLoader : public ElementVisitor {
@@ -49,8 +49,6 @@ class XMLLoader : public ElementVisitor {
   void SpectrumVectorParser(NodeHolder& holder, const Conditions& conditions,
                             std::vector<float>& out);
   Utilities::Tools::SmartPointer<DataTree> VEXDataTreeParser(const NodeHolder& holder);
-
-  NodeHolder& CurrentNode() { return current_; }
 
  private:
   template <class Node>

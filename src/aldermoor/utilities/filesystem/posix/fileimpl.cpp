@@ -69,7 +69,13 @@ DateTime FileImpl::GetModificationDate() const try {
 ALDERMOOR_FRAME(Aldermoor::Platform::Posix::FileImpl::GetModificationDate)
 
 bool FileImpl::IsAccessable(bool forWriting) const try {
-  return Descriptor(GetAbsolutePlatformName(), forWriting ? O_RDWR : O_RDONLY).IsOpen();
+  const std::string path = GetAbsolutePlatformName();
+  struct stat status {};
+  if (::stat(path.c_str(), &status) == 0 && S_ISFIFO(status.st_mode)) {
+    // To open a pipe and to close it again would end the program at its other end.
+    return ::faccessat(AT_FDCWD, path.c_str(), forWriting ? R_OK | W_OK : R_OK, AT_EACCESS) == 0;
+  }
+  return Descriptor(path, forWriting ? O_RDWR : O_RDONLY).IsOpen();
 }
 ALDERMOOR_FRAME(Aldermoor::Platform::Posix::FileImpl::IsAccessable)
 
