@@ -15,9 +15,9 @@ inline constexpr double kFloatRounding = 1.0 / (1 << 24);
 /// precision.
 inline constexpr double kWhitePoint = 0.0006;
 
-/// The white points of ASTM E308 are sums of weights that were rounded to three decimals one by
-/// one. Such roundings add up to some units of the third decimal; the worst here is Z of F7 with
-/// 0.0074.
+/// White points cited from ASTM E308 are sums of weights rounded to three decimals one by one,
+/// which may add up to some units of the third decimal.  Set after the worst row here, Z of F7 with
+/// 0.0074; all others are within 0.005.
 inline constexpr double kPublishedWhitePoint = 0.008;
 
 /// Weights of Y add up to 100 but for 36 roundings in single precision.

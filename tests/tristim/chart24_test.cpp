@@ -59,7 +59,7 @@ TEST(Chart24Test, EveryPatchHasThePublishedColor) {
     EXPECT_TRUE(Near(xyy[1], static_cast<double>(patch.y), kChartChromaticity));
     EXPECT_TRUE(Near(xyy[2], static_cast<double>(patch.Y), kChartLuminance));
 
-    // White of ASTM E308 for D50 and the two-degree observer.
+    // White for D50 and the two-degree observer as commonly cited from ASTM E308.
     const Internals::Triple published = Internals::LabFromXyz(
         {patch.x / patch.y * patch.Y, patch.Y, (1.0F - patch.x - patch.y) / patch.y * patch.Y},
         {96.422F, 100.0F, 82.521F});

@@ -34,7 +34,8 @@ constexpr WhiteCase kWhites[] = {
     {"D65", "TenDegree", 94.811, 107.305}, {"A", "TwoDegree", 109.849, 35.585},
     {"C", "TwoDegree", 98.073, 118.232},   {"F11", "TwoDegree", 100.963, 64.353}};
 
-// Source: ASTM E308-01, table 5, weights for 10 nm.
+// As commonly cited from ASTM E308-01, table 5, weights for 10 nm; not yet compared with a copy of
+// the standard.
 constexpr WhiteCase kPublishedWhites[] = {
     {"A", "TwoDegree", 109.850, 35.585},   {"C", "TwoDegree", 98.074, 118.232},
     {"D50", "TwoDegree", 96.422, 82.521},  {"D55", "TwoDegree", 95.682, 92.149},

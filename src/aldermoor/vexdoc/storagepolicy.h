@@ -29,6 +29,13 @@ typename ElementList<T>::const_iterator FindByName(const ElementList<T>& list,
 }
 
 template <class T>
+void SwapEntries(ElementList<T>& list, typename ElementList<T>::const_iterator first,
+                 typename ElementList<T>::const_iterator second) {
+  // An erase of nothing turns a constant position into one that can be written through.
+  std::swap(*list.erase(first, first), *list.erase(second, second));
+}
+
+template <class T>
 [[noreturn]] void FailNotFound(const std::string& name) {
   std::string message = "Could not find %TYPE%/%NAME%";
   Utilities::Exceptions::ReplaceAll("%TYPE%", Utilities::Tools::TypeName<T>(), message);
@@ -70,7 +77,7 @@ class MultiStoragePolicy {
   }
 
   void SwapEntries(Position first, Position second) {
-    std::swap(*Mutable(first), *Mutable(second));
+    StorageDetail::SwapEntries<T>(list_, first, second);
   }
 
   void Clear() { list_.clear(); }
@@ -78,9 +85,6 @@ class MultiStoragePolicy {
   void Swap(MultiStoragePolicy& other) noexcept { list_.swap(other.list_); }
 
  private:
-  // An erase of nothing turns a constant position into one that can be written through.
-  typename Elements::iterator Mutable(Position position) { return list_.erase(position, position); }
-
   Elements list_;
 };
 
@@ -141,7 +145,7 @@ class UniqueStoragePolicy {
   }
 
   void SwapEntries(Position first, Position second) {
-    std::swap(*Mutable(first), *Mutable(second));
+    StorageDetail::SwapEntries<T>(list_, first, second);
   }
 
   void Clear() {
@@ -155,8 +159,6 @@ class UniqueStoragePolicy {
   }
 
  private:
-  typename Elements::iterator Mutable(Position position) { return list_.erase(position, position); }
-
   std::map<std::string, Pointer> index_;
   Elements list_;
 };
