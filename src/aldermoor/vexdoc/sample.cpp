@@ -10,6 +10,7 @@
 namespace Aldermoor::Vexdoc {
 
 using Utilities::Exceptions::Filled;
+using Utilities::Exceptions::OutOfRangeException;
 using Utilities::Exceptions::ResourceNotAvailableException;
 using Utilities::Tools::SmartPointer;
 
@@ -85,6 +86,32 @@ SmartPointer<SampleAttribute> Sample::Compute(const std::string& type, const Con
   }
   return {};
 }
+
+SampleAttributeIterator Sample::GetFirstSampleAttribute() const try {
+  return SampleAttributeIterator(GetElements(), Conditions());
+}
+ALDERMOOR_FRAME(Aldermoor::Vexdoc::Sample::GetFirstSampleAttribute)
+
+SampleAttributeIterator Sample::GetFirstSampleAttribute(const Conditions& filter) const try {
+  return SampleAttributeIterator(GetElements(), filter);
+}
+ALDERMOOR_FRAME(Aldermoor::Vexdoc::Sample::GetFirstSampleAttribute)
+
+void Sample::Remove(SampleAttributeIterator& position) try {
+  // An iterator at its end, or on the attributes of another sample, has nothing to remove here.
+  if (!position.HasNext() || position.elements_ != &GetElements()) {
+    return;
+  }
+  try {
+    position.position_ = RemoveElement(position.position_);
+    if (position.HasNext() && !position.HasMatch()) {
+      position.Move2NextMatch();
+    }
+  } catch (const OutOfRangeException&) {
+    // The attribute is gone, which is what was asked for.
+  }
+}
+ALDERMOOR_FRAME(Aldermoor::Vexdoc::Sample::Remove)
 
 void Sample::RemoveAll() try { Clear(); }
 ALDERMOOR_FRAME(Aldermoor::Vexdoc::Sample::RemoveAll)

@@ -5,6 +5,7 @@
 
 #include "aldermoor/export.h"
 #include "aldermoor/vexdoc/sampleattribute.h"
+#include "aldermoor/vexdoc/sampleattributeiterator.h"
 #include "aldermoor/vexdoc/vexnode.h"
 
 namespace Aldermoor::Vexdoc {
@@ -34,6 +35,13 @@ class ALDERMOOR_EXPORT Sample
   Utilities::Tools::SmartPointer<SampleAttribute> GetSampleAttribute(const std::string& type,
                                                                      const Conditions& conditions,
                                                                      bool store) const;
+
+  /// A walk over all attributes.
+  SampleAttributeIterator GetFirstSampleAttribute() const;
+  /// A walk over the attributes whose conditions hold everything that `filter` asks for.
+  SampleAttributeIterator GetFirstSampleAttribute(const Conditions& filter) const;
+  /// Removes the attribute on which `position` stands and moves on to the next match.
+  void Remove(SampleAttributeIterator& position);
 
   void RemoveAll();
   void SetParent(Header* parent) override;

@@ -4,6 +4,7 @@
 #include "aldermoor/vexdoc/elementvisitor.h"
 #include "aldermoor/vexdoc/setparent.h"
 #include "aldermoor/vexdoc/vex.h"
+#include "aldermoor/vexdoc/vexexception.h"
 #include "aldermoor/vexdoc/vexnode.inl.h"
 
 namespace Aldermoor::Vexdoc {
@@ -26,6 +27,18 @@ ALDERMOOR_FRAME(Aldermoor::Vexdoc::SampleSet::GetSample)
 
 std::string SampleSet::AddSample(const Sample& sample) try { return AddElement(sample)->GetName(); }
 ALDERMOOR_FRAME(Aldermoor::Vexdoc::SampleSet::AddSample)
+
+std::string SampleSet::InsertSample(const Sample& sample, SampleIterator& position) try {
+  if (!position.HasNext() || position.set_->second.Get() != this) {
+    throw VexException("SampleIterator not valid",
+                       ALDERMOOR_HERE(Aldermoor::Vexdoc::SampleSet::InsertSample));
+  }
+  const SmartPointer<Sample> copy(new Sample(sample));
+  InsertElement(copy, position.position_);
+  ++position.position_;
+  return copy->GetName();
+}
+ALDERMOOR_FRAME(Aldermoor::Vexdoc::SampleSet::InsertSample)
 
 std::string SampleSet::RenameSample(const std::string& oldName, const std::string& newName) try {
   return RenameElement(oldName, newName);

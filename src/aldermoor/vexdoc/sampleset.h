@@ -5,6 +5,7 @@
 
 #include "aldermoor/export.h"
 #include "aldermoor/vexdoc/sample.h"
+#include "aldermoor/vexdoc/sampleiterator.h"
 #include "aldermoor/vexdoc/vexnode.h"
 
 namespace Aldermoor::Vexdoc {
@@ -35,6 +36,10 @@ class ALDERMOOR_EXPORT SampleSet
   Utilities::Tools::SmartPointer<Sample> GetSample(const std::string& name) const override;
   /// Adds a copy and returns its name, which is another one if that of `sample` was taken.
   std::string AddSample(const Sample& sample);
+  /// Inserts a copy in front of the sample of this set on which `position` stands, and moves
+  /// `position` to the entry behind that one, whatever its filter says.  Returns the copy's name.
+  /// Throws: VexException if `position` stands on no sample of this set.
+  std::string InsertSample(const Sample& sample, SampleIterator& position);
   /// See RenameElement.
   std::string RenameSample(const std::string& oldName, const std::string& newName);
   void RemoveSample(const std::string& name);

@@ -1,17 +1,23 @@
 #include "aldermoor/vexdoc/vex.h"
 
 #include <istream>
+#include <ostream>
 #include <stdexcept>
+#include <string_view>
 
 #include "aldermoor/utilities/exceptions/exceptions.h"
 #include "aldermoor/utilities/exceptions/frame.h"
+#include "aldermoor/utilities/filesystem/path.h"
+#include "aldermoor/utilities/filesystem/posix/filestamp.h"
 #include "aldermoor/vexdoc/elementvisitor.h"
+#include "aldermoor/vexdoc/internals/binaryprovider.h"
 #include "aldermoor/vexdoc/internals/xercesadapter.h"
 #include "aldermoor/vexdoc/vexexception.h"
 #include "aldermoor/vexdoc/vexnode.inl.h"
 
 namespace Aldermoor::Vexdoc {
 
+using Platform::Posix::FileStamp;
 using Utilities::Exceptions::OutOfRangeException;
 using Utilities::Exceptions::ResourceNotAvailableException;
 using Utilities::FileSystem::File;
@@ -19,8 +25,62 @@ using Utilities::Tools::SmartPointer;
 
 namespace {
 
-SmartPointer<Internals::XMLParserAdapter> GetXMLParserAdapter(VEX& document) {
-  return SmartPointer<Internals::XMLParserAdapter>(new Internals::XercesAdapter(&document));
+// Both only read the document of a `const` operation.
+SmartPointer<Internals::XMLParserAdapter> GetXMLParserAdapter(const VEX& document) {
+  return SmartPointer<Internals::XMLParserAdapter>(
+      new Internals::XercesAdapter(const_cast<VEX*>(&document)));
+}
+
+SmartPointer<Internals::BinaryProvider> GetBinaryProvider(const VEX& document) {
+  return SmartPointer<Internals::BinaryProvider>(
+      new Internals::BinaryProvider(const_cast<VEX*>(&document)));
+}
+
+constexpr const char* kCacheDirectory = "Cache";
+
+// "Cache/paper.vexb" beside "paper.xml".
+File GetCacheFile(const File& xml) {
+  namespace FileSystem = Utilities::FileSystem;
+  constexpr std::string_view kExtension = ".xml";
+  std::string stem = xml.GetName();
+  if (xml.IsOfType(std::string(kExtension))) {
+    stem.resize(stem.size() - kExtension.size());
+  }
+  const std::string directory =
+      FileSystem::JoinPath(FileSystem::ParentPath(xml.GetAbsoluteName()), kCacheDirectory);
+  return File(FileSystem::JoinPath(directory, stem + ".vexb"), 0, 0);
+}
+
+FileStamp StampOf(const File& file) {
+  return FileStamp(file.GetAbsolutePlatformName());
+}
+
+// Whatever is wrong with a cache, the XML file is there.
+bool LoadFromCache(VEX& document, File& cache, const File& xml) {
+  try {
+    if (!cache.IsAccessable(false) || !(cache.GetModificationDate() > xml.GetModificationDate())) {
+      return false;
+    }
+    GetBinaryProvider(document)->Read(cache);
+    return true;
+  } catch (...) {
+    return false;
+  }
+}
+
+// Another process may have replaced the XML file while the cache of the former one was written.
+void DropCacheOfOldFile(const File& cache, const File& xml, const FileStamp& stamp) {
+  if (StampOf(xml) != stamp) {
+    cache.Remove();
+  }
+}
+
+void ApplyTypeCreator(File& file) {
+  try {
+    file.ApplyMacTypeCreator();
+  } catch (const Utilities::Exceptions::ResourceException&) {
+    // The content is there all the same.
+  }
 }
 
 }  // namespace
@@ -45,7 +105,15 @@ void VEX::Load(std::istream& in) try {
 }
 ALDERMOOR_FRAME(Aldermoor::Vexdoc::VEX::Load)
 
-void VEX::LoadXML(const File& file, bool /*updateCache*/) try {
+void VEX::Store(std::ostream& out) const try { GetXMLParserAdapter(*this)->Store(out); }
+ALDERMOOR_FRAME(Aldermoor::Vexdoc::VEX::Store)
+
+void VEX::LoadXML(const File& file, bool updateCache) try {
+  File cache = GetCacheFile(file);
+  if (LoadFromCache(*this, cache, file)) {
+    return;
+  }
+  const FileStamp stamp = StampOf(file);
   try {
     File xml(file.GetAbsoluteName());
     GetXMLParserAdapter(*this)->Load(xml);
@@ -54,8 +122,33 @@ void VEX::LoadXML(const File& file, bool /*updateCache*/) try {
   } catch (const std::exception& e) {
     throw VexException(e.what(), ALDERMOOR_HERE(Aldermoor::Vexdoc::VEX::LoadXML));
   }
+  if (!updateCache) {
+    return;
+  }
+  try {
+    file.GetDirectory().CreateSubdir(kCacheDirectory);
+    GetBinaryProvider(*this)->Write(cache);
+    DropCacheOfOldFile(cache, file, stamp);
+  } catch (...) {
+    cache.Remove();  // the document is loaded all the same
+  }
 }
 ALDERMOOR_FRAME(Aldermoor::Vexdoc::VEX::LoadXML)
+
+void VEX::SaveXML(File& file, bool updateCache) const try {
+  GetXMLParserAdapter(*this)->Store(file);
+  ApplyTypeCreator(file);
+  if (!updateCache) {
+    return;
+  }
+  const FileStamp stamp = StampOf(file);
+  file.GetDirectory().CreateSubdir(kCacheDirectory);
+  File cache = GetCacheFile(file);
+  GetBinaryProvider(*this)->Write(cache);
+  ApplyTypeCreator(cache);
+  DropCacheOfOldFile(cache, file, stamp);
+}
+ALDERMOOR_FRAME(Aldermoor::Vexdoc::VEX::SaveXML)
 
 std::string VEX::AddSampleSet(const SampleSet& set) try { return AddElement(set)->GetName(); }
 ALDERMOOR_FRAME(Aldermoor::Vexdoc::VEX::AddSampleSet)
@@ -94,6 +187,26 @@ std::string VEX::InsertSample(const std::string& setName, const Sample& sample,
   return FindElement(setName, true)->InsertElement(sample, position)->GetName();
 }
 ALDERMOOR_FRAME(Aldermoor::Vexdoc::VEX::InsertSample)
+
+std::string VEX::InsertSample(const Sample& sample, SampleIterator& position) try {
+  if (!position.HasNext()) {
+    throw VexException("SampleIterator not valid",
+                       ALDERMOOR_HERE(Aldermoor::Vexdoc::VEX::InsertSample));
+  }
+  return position.set_->second->InsertSample(sample, position);
+}
+ALDERMOOR_FRAME(Aldermoor::Vexdoc::VEX::InsertSample)
+
+SampleIterator VEX::GetFirstSample(const std::string& setName) const try {
+  return SampleIterator(GetElements(), setName);
+}
+ALDERMOOR_FRAME(Aldermoor::Vexdoc::VEX::GetFirstSample)
+
+SampleIterator VEX::GetFirstSample(const Conditions& filter, const std::string& attributeType,
+                                   const std::string& setName) const try {
+  return SampleIterator(GetElements(), filter, attributeType, setName);
+}
+ALDERMOOR_FRAME(Aldermoor::Vexdoc::VEX::GetFirstSample)
 
 SmartPointer<Sample> VEX::FindSample(const std::string& setName,
                                      const std::string& sampleName) const try {

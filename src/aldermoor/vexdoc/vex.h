@@ -6,6 +6,7 @@
 
 #include "aldermoor/export.h"
 #include "aldermoor/utilities/filesystem/file.h"
+#include "aldermoor/vexdoc/sampleiterator.h"
 #include "aldermoor/vexdoc/sampleset.h"
 #include "aldermoor/vexdoc/vexnode.h"
 
@@ -18,6 +19,7 @@ template <class T, class StoragePolicy>
 class DeprecatedVEXInterface : public VexNode<T, StoragePolicy> {
  public:
   virtual Utilities::Tools::SmartPointer<T> GetSampleSet(const std::string& name) const = 0;
+  virtual void Store(std::ostream& out) const = 0;
   virtual void Load(std::istream& in) = 0;
 
  protected:
@@ -39,16 +41,30 @@ class ALDERMOOR_EXPORT VEX
 
   /// Throws: ResourceNotAvailableException if there is no such set.
   Utilities::Tools::SmartPointer<SampleSet> GetSampleSet(const std::string& name) const override;
+  /// Writes this document as XML of the current dialect, in UTF-8.  Derived attributes and their
+  /// conditions are left out; floats get six significant digits.
+  /// Throws: VexException if the document holds what XML cannot carry.
+  void Store(std::ostream& out) const override;
   /// Replaces the content of this document by the XML read from `in`.  Its sets are removed first,
   /// and stay so if the text cannot be read.
   /// Throws: VexXMLParseException with line and column if the text is not well-formed;
   /// VexException if its content breaks a rule.
   void Load(std::istream& in) override;
-  /// Replaces the content of this document by that of the XML file `file`; on failure it stays as
-  /// it was.  No cache is kept beside the file yet, so `updateCache` has no effect.
+  /// Replaces the content of this document by that of the XML file `file`, or of its cache if that
+  /// is newer and good; on failure it stays as it was.
+  ///
+  /// The cache of "paper.xml" is "Cache/paper.vexb" beside it.  With `updateCache`, it is written
+  /// after the XML was read; a failure of that is not reported.
   /// Throws: VexXMLParseException with file, line and column if the text is not well-formed;
   /// VexParseException and VexException if its content breaks a rule or the file cannot be read.
   void LoadXML(const Utilities::FileSystem::File& file, bool updateCache);
+  /// Writes this document to `file` as Store does, and with `updateCache` to its cache.
+  ///
+  /// Files are replaced as a whole: on failure the old file is still there.  The process locale is
+  /// changed for the time of the call, so nothing that depends on it may run beside it.
+  /// Throws: ResourceNotAvailableException with the system's reason if a file cannot be written;
+  /// VexException if the document holds what XML cannot carry.
+  void SaveXML(Utilities::FileSystem::File& file, bool updateCache) const;
 
   /// The forms that add or insert keep a copy and return its name, which is another one if the
   /// name was taken.  Indices count from 0 to the number of children.
@@ -65,9 +81,18 @@ class ALDERMOOR_EXPORT VEX
   /// A set of that name is made if there is none.
   std::string AddSample(const std::string& setName, const Sample& sample);
   std::string InsertSample(const std::string& setName, const Sample& sample, const long& position);
+  /// Inserts a copy in front of the sample on which `position` stands, and moves `position` to the
+  /// entry behind that one.  Throws: VexException if `position` stands on none.
+  std::string InsertSample(const Sample& sample, SampleIterator& position);
   /// Throws: OutOfRangeException if there is no such set or no such sample in it.
   Utilities::Tools::SmartPointer<Sample> FindSample(const std::string& setName,
                                                     const std::string& sampleName) const;
+  /// A walk over the samples of the set `setName`, or of all sets if that is empty.
+  SampleIterator GetFirstSample(const std::string& setName) const;
+  /// The same over the samples that can give an attribute of the kind `attributeType` under
+  /// `filter`.  Throws: what Sample::GetSampleAttribute throws but ResourceNotAvailableException.
+  SampleIterator GetFirstSample(const Conditions& filter, const std::string& attributeType,
+                                const std::string& setName) const;
   /// Throws: ResourceNotAvailableException if there is no such set or no such sample in it.
   std::string RenameSample(const std::string& setName, const std::string& oldName,
                            const std::string& newName);

@@ -4,9 +4,11 @@
 #include <filesystem>
 #include <fstream>
 #include <istream>
+#include <new>
 #include <vector>
 
 #include <xercesc/dom/DOMDocument.hpp>
+#include <xercesc/dom/DOMException.hpp>
 #include <xercesc/framework/LocalFileInputSource.hpp>
 #include <xercesc/framework/MemBufInputSource.hpp>
 #include <xercesc/util/OutOfMemoryException.hpp>
@@ -15,10 +17,15 @@
 
 #include "aldermoor/utilities/exceptions/exceptions.h"
 #include "aldermoor/utilities/exceptions/frame.h"
+#include "aldermoor/utilities/filesystem/posix/filereplacement.h"
 #include "aldermoor/vexdoc/internals/documentaccess.h"
 #include "aldermoor/vexdoc/internals/documentparser.h"
+#include "aldermoor/vexdoc/internals/documentwriter.h"
+#include "aldermoor/vexdoc/internals/legacyloader.h"
+#include "aldermoor/vexdoc/internals/localeguard.h"
 #include "aldermoor/vexdoc/internals/parsebudget.h"
 #include "aldermoor/vexdoc/internals/xerceshelper.h"
+#include "aldermoor/vexdoc/internals/xmlcomposer.h"
 #include "aldermoor/vexdoc/vexexception.h"
 
 namespace Aldermoor::Vexdoc::Internals {
@@ -34,10 +41,13 @@ namespace {
 
 constexpr const char* kStreamName = "VEX";
 
+constexpr const char* kInternalFailure =
+    "An internal XML exception has occured while initializing XML:\n%REASON%";
+
 void CheckPlatform() {
   if (XMLPlatformUtils::fgMemoryManager == nullptr) {
     throw VexException("The XML platform is not initialised",
-                       ALDERMOOR_HERE(Aldermoor::Vexdoc::Internals::XercesAdapter::Load));
+                       ALDERMOOR_HERE(Aldermoor::Vexdoc::Internals::XercesAdapter));
   }
 }
 
@@ -65,10 +75,8 @@ void XercesAdapter::Load(std::istream& in) try {
   try {
     LoadFrom(ReadAll(in), kStreamName);
   } catch (const XMLException& e) {
-    throw VexException(
-        Filled("An internal XML exception has occured while initializing XML:\n%REASON%",
-               "%REASON%", ToNativeString(e.getMessage())),
-        ALDERMOOR_HERE(Aldermoor::Vexdoc::Internals::XercesAdapter::Load));
+    throw VexException(Filled(kInternalFailure, "%REASON%", ToNativeString(e.getMessage())),
+                       ALDERMOOR_HERE(Aldermoor::Vexdoc::Internals::XercesAdapter::Load));
   } catch (const VexXMLParseException& e) {
     // Still a VexException to who asks for one, but with the place of the fault.
     throw VexXMLParseException(StreamFailure(e), e.GetFile(), e.GetLine(), e.GetColumn(),
@@ -107,18 +115,45 @@ void XercesAdapter::Load(File& file) try {
 }
 ALDERMOOR_FRAME(Aldermoor::Vexdoc::Internals::XercesAdapter::Load)
 
+void XercesAdapter::Store(std::ostream& out) try {
+  CheckPlatform();
+  try {
+    const DocumentWriter writer;
+    XMLComposer composer(writer.GetDocument());
+    document_->AcceptVisitor(composer);
+    writer.GetDocument().appendChild(composer.GetCurrentNode());
+    writer.Write(out, composer.HasMixedContent());
+  } catch (const XMLException& e) {
+    throw VexException(Filled(kInternalFailure, "%REASON%", ToNativeString(e.getMessage())),
+                       ALDERMOOR_HERE(Aldermoor::Vexdoc::Internals::XercesAdapter::Store));
+  } catch (const xercesc::DOMException& e) {
+    throw VexException(Filled(kInternalFailure, "%REASON%", ToNativeString(e.getMessage())),
+                       ALDERMOOR_HERE(Aldermoor::Vexdoc::Internals::XercesAdapter::Store));
+  } catch (const xercesc::OutOfMemoryException&) {
+    throw std::bad_alloc();
+  } catch (const VexException& e) {
+    throw VexException(
+        Filled("An error occurred during composing a VEXStream:\n%REASON%", "%REASON%", e.what()),
+        ALDERMOOR_HERE(Aldermoor::Vexdoc::Internals::XercesAdapter::Store));
+  }
+}
+ALDERMOOR_FRAME(Aldermoor::Vexdoc::Internals::XercesAdapter::Store)
+
+void XercesAdapter::Store(File& file) try {
+  const LocaleGuard guard(".ACP");
+  Platform::Posix::FileReplacement replacement(file.GetAbsolutePlatformName());
+  Store(replacement.GetStream());
+  replacement.Commit();
+}
+ALDERMOOR_FRAME(Aldermoor::Vexdoc::Internals::XercesAdapter::Store)
+
 SmartPointer<XMLLoader> XercesAdapter::GetLoader(xercesc::DOMDocument* document) try {
   const NodeHolder holder(document);
   std::string name = "Version";
   std::string version;
   holder.FindChild("VEX", true).GetAttribute(name, version);
-  if (version.empty()) {
-    throw VexException(
-        "The root element has no \"Version\": documents of the legacy dialect "
-        "are not read",
-        ALDERMOOR_HERE(Aldermoor::Vexdoc::Internals::XercesAdapter::GetLoader));
-  }
-  return SmartPointer<XMLLoader>(new XMLLoader(holder));
+  return SmartPointer<XMLLoader>(version.empty() ? new LegacyLoader(holder)
+                                                 : new XMLLoader(holder));
 }
 ALDERMOOR_FRAME(Aldermoor::Vexdoc::Internals::XercesAdapter::GetLoader)
 

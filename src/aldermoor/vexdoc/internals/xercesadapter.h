@@ -35,6 +35,14 @@ class XercesAdapter : public XMLParserAdapter {
   /// the loader throw.
   void Load(Utilities::FileSystem::File& file) override;
 
+  /// Writes the document in the current dialect, in UTF-8.
+  /// Throws: VexException with the failure's text.
+  void Store(std::ostream& out) override;
+  /// The same to a file, which is replaced as a whole.  The locale of the process is changed for
+  /// the time of the call.
+  /// Throws: ResourceNotAvailableException for a file that cannot be written.
+  void Store(Utilities::FileSystem::File& file) override;
+
   /// The loader for the dialect of a parsed document, which its root's "Version" tells.
   static Utilities::Tools::SmartPointer<XMLLoader> GetLoader(xercesc::DOMDocument* document);
 

@@ -1,5 +1,6 @@
 #include "aldermoor/vexdoc/internals/xerceshelper.h"
 
+#include <algorithm>
 #include <array>
 #include <charconv>
 #include <locale>
@@ -10,6 +11,7 @@
 #include <xercesc/util/XMLString.hpp>
 
 #include "aldermoor/utilities/tools/lexicalcast.h"
+#include "aldermoor/vexdoc/vexexception.h"
 
 namespace Aldermoor::Vexdoc::Internals {
 
@@ -44,6 +46,42 @@ NativeBuffer::NativeBuffer(const XMLCh* text)
 
 NativeBuffer::~NativeBuffer() {
   XMLString::release(&text_, XMLPlatformUtils::fgMemoryManager);
+}
+
+const XMLCh* XMLChText::Set(const std::string& text) {
+  // Nearly all text is ASCII, which is the same in both; the rest goes through the transcoder.
+  const auto is_ascii = [](char c) {
+    return c > 0;
+  };
+  if (std::all_of(text.begin(), text.end(), is_ascii)) {
+    return SetAscii(text.data(), text.data() + text.size());
+  }
+  text_ = XMLChBuffer(text).Get();
+  // The transcoder puts a substitute for what it does not know.
+  if (ToNativeString(text_.c_str()) != text) {
+    throw VexException("XML cannot carry the text '" + text + "'",
+                       ALDERMOOR_HERE(Aldermoor::Vexdoc::Internals::XMLChText::Set));
+  }
+  return text_.c_str();
+}
+
+const XMLCh* XMLChText::Set(float value) {
+  constexpr int kSignificantDigits = 6;
+  std::array<char, 32> digits;
+  return SetAscii(digits.data(), std::to_chars(digits.data(), digits.data() + digits.size(), value,
+                                               std::chars_format::general, kSignificantDigits)
+                                     .ptr);
+}
+
+const XMLCh* XMLChText::Set(unsigned int value) {
+  std::array<char, 16> digits;
+  return SetAscii(digits.data(),
+                  std::to_chars(digits.data(), digits.data() + digits.size(), value).ptr);
+}
+
+const XMLCh* XMLChText::SetAscii(const char* begin, const char* end) {
+  text_.assign(begin, end);
+  return text_.c_str();
 }
 
 std::string ToNativeString(const XMLCh* text) {

@@ -36,6 +36,22 @@ class NativeBuffer {
   char* text_;
 };
 
+/// Text in the parser's characters, in memory that is used again for the next one.
+class XMLChText {
+ public:
+  /// The three forms give a pointer that is good until the next call.
+  /// Throws: VexException if `text` holds a zero byte or is not in the local code page.
+  const XMLCh* Set(const std::string& text);
+  /// Six significant digits, as a stream writes them.
+  const XMLCh* Set(float value);
+  const XMLCh* Set(unsigned int value);
+
+ private:
+  const XMLCh* SetAscii(const char* begin, const char* end);
+
+  std::u16string text_;
+};
+
 /// A string of the model from the parser's characters; empty for null.
 std::string ToNativeString(const XMLCh* text);
 

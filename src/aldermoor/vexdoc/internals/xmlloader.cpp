@@ -2,6 +2,7 @@
 
 #include <algorithm>
 #include <array>
+#include <iterator>
 #include <utility>
 
 #include <xercesc/util/XMLString.hpp>
@@ -11,9 +12,11 @@
 #include "aldermoor/vexdoc/colorvector.h"
 #include "aldermoor/vexdoc/conditionkeys.h"
 #include "aldermoor/vexdoc/internals/conditionmanager.h"
+#include "aldermoor/vexdoc/internals/customillumination.h"
 #include "aldermoor/vexdoc/internals/documentaccess.h"
 #include "aldermoor/vexdoc/internals/elementfactory.h"
 #include "aldermoor/vexdoc/internals/xerceshelper.h"
+#include "aldermoor/vexdoc/internals/xmlnames.h"
 #include "aldermoor/vexdoc/recipe.h"
 #include "aldermoor/vexdoc/spectrum.h"
 #include "aldermoor/vexdoc/unknownsampleattribute.h"
@@ -28,30 +31,9 @@ using xercesc::XMLString;
 
 namespace {
 
-constexpr XMLCh kVex[] = u"VEX";
-constexpr XMLCh kSampleSet[] = u"SampleSet";
-constexpr XMLCh kSample[] = u"Sample";
-constexpr XMLCh kSampleAttribute[] = u"SampleAttribute";
-constexpr XMLCh kConditions[] = u"Conditions";
-constexpr XMLCh kId[] = u"ID";
-constexpr XMLCh kSpectrum[] = u"Spectrum";
-constexpr XMLCh kValue[] = u"Value";
-constexpr XMLCh kName[] = u"Name";
-constexpr XMLCh kAdditionalData[] = u"AdditionalData";
+using namespace XMLNames;
+
 constexpr XMLCh kAnyElement[] = u"*";
-
-struct HeaderKey {
-  const XMLCh* element;
-  const char* key;
-};
-
-constexpr std::array<HeaderKey, 5> kHeaderKeys = {{
-    {kName, Header::kNameKey},
-    {u"Description", Header::kDescriptionKey},
-    {u"Creator", Header::kCreatorKey},
-    {u"Created", Header::kCreatedKey},
-    {u"Modified", Header::kModifiedKey},
-}};
 
 // Calls `visit(name, holder)` for every child that has an attribute, with the value of its first
 // one, whatever child and attribute are called.
@@ -78,14 +60,26 @@ void ForEachValue(const NodeHolder& parent, Visit visit) {
   }
 }
 
-// A custom illumination is read against these, whatever its block says.
-Conditions CustomIlluminationConditions() {
-  Conditions conditions;
-  conditions.AddAttribute(ConditionKeys::kWavelengthMin, "380nm");
-  conditions.AddAttribute(ConditionKeys::kWavelengthMax, "730nm");
-  conditions.AddAttribute(ConditionKeys::kPointCount, "36");
-  conditions.AddAttribute(ConditionKeys::kSpectrumType, "AmbientLight");
-  return conditions;
+// The values of a spectrum in ascending order of wavelength; of equal wavelengths the first counts.
+std::vector<float> ValuesByWavelength(const NodeHolder& holder) {
+  std::vector<std::pair<unsigned int, float>> points;
+  ForEachValue(holder, [&points](const XMLCh* wavelength, const NodeHolder& value) {
+    points.emplace_back(ReadUnsigned(wavelength), value.GetFloat());
+  });
+  const auto by_wavelength = [](const auto& a, const auto& b) {
+    return a.first < b.first;
+  };
+  if (!std::is_sorted(points.begin(), points.end(), by_wavelength)) {
+    std::stable_sort(points.begin(), points.end(), by_wavelength);
+  }
+  const auto same_wavelength = [](const auto& a, const auto& b) {
+    return a.first == b.first;
+  };
+  points.erase(std::unique(points.begin(), points.end(), same_wavelength), points.end());
+  std::vector<float> values(points.size());
+  std::transform(points.begin(), points.end(), values.begin(),
+                 [](const auto& point) { return point.second; });
+  return values;
 }
 
 }  // namespace
@@ -164,14 +158,14 @@ void XMLLoader::LoadSampleAttribute(Attribute& attribute) {
 
 void XMLLoader::HeaderParser(NodeHolder& holder, Header& header, bool isSampleAttribute) try {
   // One walk over the children for all keys; the first child of a name counts.
-  std::array<DOMNode*, kHeaderKeys.size()> found{};
+  std::array<DOMNode*, std::size(kHeaderKeys)> found{};
   DOMNode* additional_data = nullptr;
   for (DOMNode* child = holder.GetXMLNode().getFirstChild(); child != nullptr;
        child = child->getNextSibling()) {
     if (child->getNodeType() != DOMNode::ELEMENT_NODE) {
       continue;
     }
-    for (std::size_t i = 0; i < kHeaderKeys.size(); ++i) {
+    for (std::size_t i = 0; i < found.size(); ++i) {
       if (found[i] == nullptr && XMLString::equals(child->getNodeName(), kHeaderKeys[i].element)) {
         found[i] = child;
       }
@@ -183,7 +177,7 @@ void XMLLoader::HeaderParser(NodeHolder& holder, Header& header, bool isSampleAt
   if (found[0] == nullptr && !isSampleAttribute) {
     holder.FindChild(kName, true);  // raises the failure
   }
-  for (std::size_t i = 0; i < kHeaderKeys.size(); ++i) {
+  for (std::size_t i = 0; i < found.size(); ++i) {
     if (found[i] != nullptr) {
       header.SetAttribute(kHeaderKeys[i].key, NodeHolder(found[i]).GetText());
     }
@@ -220,30 +214,27 @@ void XMLLoader::SpectrumVectorParser(NodeHolder& holder, const Conditions& condi
                                      std::vector<float>& out) try {
   const auto expected = Utilities::Tools::lexical_cast<unsigned int>(
       conditions.GetAttribute(ConditionKeys::kPointCount, "36"));
-  std::vector<std::pair<unsigned int, float>> points;
-  ForEachValue(holder, [&points](const XMLCh* wavelength, const NodeHolder& value) {
-    points.emplace_back(ReadUnsigned(wavelength), value.GetFloat());
-  });
-  const auto by_wavelength = [](const auto& a, const auto& b) {
-    return a.first < b.first;
-  };
-  if (!std::is_sorted(points.begin(), points.end(), by_wavelength)) {
-    std::stable_sort(points.begin(), points.end(), by_wavelength);
-  }
-  const auto same_wavelength = [](const auto& a, const auto& b) {
-    return a.first == b.first;
-  };
-  points.erase(std::unique(points.begin(), points.end(), same_wavelength), points.end());
-  if (points.size() != expected) {
+  std::vector<float> values = ValuesByWavelength(holder);
+  if (values.size() != expected) {
     throw VexParseException(
         "Missing Spectrum elements in XML",
         ALDERMOOR_HERE(Aldermoor::Vexdoc::Internals::XMLLoader::SpectrumVectorParser));
   }
-  out.resize(points.size());
-  std::transform(points.begin(), points.end(), out.begin(),
-                 [](const auto& point) { return point.second; });
+  out.swap(values);
 }
 ALDERMOOR_FRAME(Aldermoor::Vexdoc::Internals::XMLLoader::SpectrumVectorParser)
+
+std::vector<float> XMLLoader::ReadSpectrumValues() const {
+  return ValuesByWavelength(current_);
+}
+
+std::vector<std::pair<std::string, float>> XMLLoader::ReadChannels() const {
+  std::vector<std::pair<std::string, float>> channels;
+  ForEachValue(current_, [&channels](const XMLCh* label, const NodeHolder& value) {
+    channels.emplace_back(ToNativeString(label), value.GetFloat());
+  });
+  return channels;
+}
 
 void XMLLoader::LoadMembers(Spectrum& spectrum) try {
   SpectrumVectorParser(current_, *spectrum.GetConditions(), DocumentAccess::Data(spectrum));
@@ -251,25 +242,21 @@ void XMLLoader::LoadMembers(Spectrum& spectrum) try {
 ALDERMOOR_FRAME(Aldermoor::Vexdoc::Internals::XMLLoader::LoadMembers)
 
 void XMLLoader::LoadMembers(ColorVector& vector) try {
-  std::vector<std::pair<std::string, float>> channels;
-  ForEachValue(current_, [&channels](const XMLCh* label, const NodeHolder& value) {
-    channels.emplace_back(ToNativeString(label), value.GetFloat());
-  });
-  DocumentAccess::ReplaceContent(vector, ColorVector(*vector.GetConditions(), channels));
+  DocumentAccess::ReplaceContent(vector, ColorVector(*vector.GetConditions(), ReadChannels()));
 }
 ALDERMOOR_FRAME(Aldermoor::Vexdoc::Internals::XMLLoader::LoadMembers)
 
 void XMLLoader::LoadMembers(Recipe& recipe) try {
-  if (const NodeHolder name = current_.FindChild(u"AssortmentName", false); !name.IsNull()) {
+  if (const NodeHolder name = current_.FindChild(kAssortmentName, false); !name.IsNull()) {
     recipe.SetAssortmentName(name.GetText());
   }
-  if (const NodeHolder thickness = current_.FindChild(u"Thickness", false); !thickness.IsNull()) {
+  if (const NodeHolder thickness = current_.FindChild(kThickness, false); !thickness.IsNull()) {
     recipe.SetThickness(thickness.GetFloat());
   }
-  if (const NodeHolder link = current_.FindChild(u"SubstrateLinkName", false); !link.IsNull()) {
+  if (const NodeHolder link = current_.FindChild(kSubstrateLinkName, false); !link.IsNull()) {
     recipe.SetSubstrateLinkName(link.GetText());
   }
-  if (const NodeHolder list = current_.FindChild(u"Components", false); !list.IsNull()) {
+  if (const NodeHolder list = current_.FindChild(kComponents, false); !list.IsNull()) {
     Recipe::Components components;
     ForEachNamedChild(list, [&components](const std::string& name, const NodeHolder& child) {
       components.emplace_back(name, child.GetFloat());

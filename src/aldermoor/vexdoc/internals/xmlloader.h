@@ -3,6 +3,7 @@
 
 #include <map>
 #include <string>
+#include <utility>
 #include <vector>
 
 #include "aldermoor/utilities/tools/smartpointer.h"
@@ -49,6 +50,11 @@ class XMLLoader : public ElementVisitor {
   void SpectrumVectorParser(NodeHolder& holder, const Conditions& conditions,
                             std::vector<float>& out);
   Utilities::Tools::SmartPointer<DataTree> VEXDataTreeParser(const NodeHolder& holder);
+
+  /// The same of the current node, however many there are.
+  std::vector<float> ReadSpectrumValues() const;
+  /// Label and value of the "Value" children of the current node, in the order of the file.
+  std::vector<std::pair<std::string, float>> ReadChannels() const;
 
  private:
   template <class Node>

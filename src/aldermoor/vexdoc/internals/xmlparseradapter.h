@@ -7,7 +7,7 @@
 
 namespace Aldermoor::Vexdoc::Internals {
 
-/// Fills the document that it serves from XML; lives for one call.
+/// Fills the document that it serves from XML, or writes it; lives for one call.
 class XMLParserAdapter {
  public:
   XMLParserAdapter() = default;
@@ -17,6 +17,8 @@ class XMLParserAdapter {
 
   virtual void Load(std::istream& in) = 0;
   virtual void Load(Utilities::FileSystem::File& file) = 0;
+  virtual void Store(std::ostream& out) = 0;
+  virtual void Store(Utilities::FileSystem::File& file) = 0;
 };
 
 }  // namespace Aldermoor::Vexdoc::Internals

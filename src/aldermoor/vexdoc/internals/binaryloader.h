@@ -1,0 +1,79 @@
+#ifndef ALDERMOOR_VEXDOC_INTERNALS_BINARYLOADER_H
+#define ALDERMOOR_VEXDOC_INTERNALS_BINARYLOADER_H
+
+#include <cstdint>
+#include <iosfwd>
+#include <map>
+#include <string>
+#include <utility>
+#include <vector>
+
+#include "aldermoor/utilities/tools/smartpointer.h"
+#include "aldermoor/vexdoc/dataitem.h"
+#include "aldermoor/vexdoc/elementvisitor.h"
+#include "aldermoor/vexdoc/vex.h"
+
+namespace Aldermoor::Vexdoc::Internals {
+
+/// Builds a new document from the binary format of the cache.
+///
+/// The file is read strictly forward.  Attributes know their conditions by the ID of the file only
+/// until the condition table at its end was read; then all are given the shared block, and colours
+/// their channels.
+/// Throws: VexException for another version of the format and for data trees that nest too deep;
+/// ResourceNotAvailableException at the end of the file and for a link to an ID that the table
+/// lacks; what the constructors of the attributes throw.
+class BinaryLoader : public ElementVisitor {
+ public:
+  /// `in` is kept by reference.  Nothing is read from one without positions, such as a pipe.
+  explicit BinaryLoader(std::istream& in);
+  ~BinaryLoader() override;
+
+  Utilities::Tools::SmartPointer<VEX> Load();
+
+  void VisitVex(VEX& vex) override;
+  void VisitSampleSet(SampleSet& set) override;
+  void VisitSample(Sample& sample) override;
+  void VisitSpectrum(Spectrum& spectrum) override;
+  void VisitColorVector(ColorVector& vector) override;
+  void VisitRecipe(Recipe& recipe) override;
+  void VisitUnknownSampleAttribute(UnknownSampleAttribute& attribute) override;
+
+ protected:
+  virtual void LoadHeader(Header& header);
+  virtual void LoadConditions();
+  virtual void LoadDataTree(DataTree& tree);
+  virtual std::uint32_t ReadNumber();
+  virtual std::string ReadString();
+  virtual float ReadFloat();
+
+ private:
+  using Channels = std::vector<std::pair<std::string, float>>;
+
+  template <class Node>
+  void LoadVexNode(Node& node);
+  template <class Attribute>
+  void LoadSampleAttribute(Attribute& attribute);
+
+  void LoadMembers(Spectrum& spectrum);
+  void LoadMembers(ColorVector& vector);
+  void LoadMembers(Recipe& recipe);
+  void LoadMembers(UnknownSampleAttribute& attribute);
+  void LoadVector(std::vector<float>& target);
+  void LoadCustomIllumination(Conditions& conditions);
+  void RelinkConditions(VEX& vex);
+
+  // Whether all `count` bytes were there.
+  bool Read(char* bytes, std::size_t count);
+
+  std::map<std::string, std::string> condition_links_;  // ID in the file to ID in the manager
+  std::istream& in_;
+  std::uint64_t bytes_left_ = 0;
+  unsigned int tree_depth_ = 0;
+  // Colours in the order of the file, whose constructor needs the real conditions.
+  std::vector<std::pair<ColorVector*, Channels>> pending_colors_;
+};
+
+}  // namespace Aldermoor::Vexdoc::Internals
+
+#endif  // ALDERMOOR_VEXDOC_INTERNALS_BINARYLOADER_H

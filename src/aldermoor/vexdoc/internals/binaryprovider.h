@@ -1,0 +1,30 @@
+#ifndef ALDERMOOR_VEXDOC_INTERNALS_BINARYPROVIDER_H
+#define ALDERMOOR_VEXDOC_INTERNALS_BINARYPROVIDER_H
+
+#include "aldermoor/utilities/filesystem/file.h"
+#include "aldermoor/vexdoc/vex.h"
+
+namespace Aldermoor::Vexdoc::Internals {
+
+/// Fills the document that it serves from a cache file, or writes it to one; lives for one call.
+class BinaryProvider {
+ public:
+  /// `document` is not owned.
+  explicit BinaryProvider(VEX* document);
+  virtual ~BinaryProvider() = default;
+
+  /// Throws: VexException for a file that cannot be read; what BinaryLoader throws.  The document
+  /// then stays as it was.
+  virtual void Read(Utilities::FileSystem::File& file);
+  /// Replaces the file as a whole.
+  /// Throws: ResourceNotAvailableException for a file that cannot be written; what BinaryDumper
+  /// throws.  The old file then stays.
+  virtual void Write(Utilities::FileSystem::File& file);
+
+ private:
+  VEX* document_;
+};
+
+}  // namespace Aldermoor::Vexdoc::Internals
+
+#endif  // ALDERMOOR_VEXDOC_INTERNALS_BINARYPROVIDER_H
