@@ -77,6 +77,10 @@ std::string SamplesText(unsigned count) {
   return text;
 }
 
+std::string SamplesName(unsigned count) {
+  return std::to_string(count / 1000) + ",000 samples";
+}
+
 std::string HeaderValuesText(unsigned count) {
   std::string text(kOpen);
   text.append("  <AdditionalData>\n");
@@ -109,11 +113,15 @@ Workspace::~Workspace() {
   std::filesystem::remove_all(path_, ignored);
 }
 
-Document Workspace::Keep(const std::string& name, std::string text) const {
+std::string Workspace::PathOf(const std::string& name) const {
   std::string file = name;
   std::replace_if(
       file.begin(), file.end(), [](char c) { return c == ' ' || c == ','; }, '_');
-  Document document{name, path_ + "/" + file + ".xml", std::move(text)};
+  return path_ + "/" + file + ".xml";
+}
+
+Document Workspace::Keep(const std::string& name, std::string text) const {
+  Document document{name, PathOf(name), std::move(text)};
   std::ofstream out(document.path, std::ios::binary);
   out.write(document.text.data(), static_cast<std::streamsize>(document.text.size()));
   out.close();

@@ -15,6 +15,8 @@ struct Document {
 /// Texts as a writer that indents would write them, with all the time stamps that elements carry.
 /// One set of `count` samples, each with one spectrum of 36 bands under shared conditions.
 std::string SamplesText(unsigned count);
+/// "10,000 samples" for 10000, which must be whole thousands.
+std::string SamplesName(unsigned count);
 /// `count` values of the root's header in "AdditionalData".
 std::string HeaderValuesText(unsigned count);
 /// One block of `count` condition attributes.
@@ -31,6 +33,8 @@ class Workspace {
 
   /// Throws: std::runtime_error if the file cannot be written.
   Document Keep(const std::string& name, std::string text) const;
+  /// The path of a file in the directory; blanks and commas of `name` are replaced.
+  std::string PathOf(const std::string& name) const;
 
  private:
   std::string path_;

@@ -1,7 +1,6 @@
 #include "benchmarks/loadbenchmark.h"
 
 #include <array>
-#include <ctime>
 #include <iostream>
 #include <string>
 
@@ -25,63 +24,33 @@ struct Size {
   int repetitions;
 };
 
-constexpr std::array<Size, 3> kSizes = {{{1000, 3, 9}, {10000, 1, 5}, {100000, 1, 1}}};
-
-double ProcessorSeconds() {
-  std::timespec time{};
-  clock_gettime(CLOCK_PROCESS_CPUTIME_ID, &time);
-  return static_cast<double>(time.tv_sec) + 1e-9 * static_cast<double>(time.tv_nsec);
-}
+constexpr std::array<Size, 4> kSizes = {
+    {{1000, 3, 9}, {10000, 1, 5}, {100000, 1, 1}, {200000, 1, 1}}};
 
 // Every load starts as the first one of a process does.  Letting go of the document loaded is not
 // part of loading it.
 double SecondsOfLoad(const Document& document, Source source) {
   ForgetConditions();
   Vexdoc::VEX vex;
-  const double start = ProcessorSeconds();
-  Load(vex, document, source);
-  return ProcessorSeconds() - start;
-}
-
-double SecondsOfParse(const Document& document, Source source) {
-  const double start = ProcessorSeconds();
-  Parse(document, source);
-  return ProcessorSeconds() - start;
-}
-
-// A load right after a bare parse, so that both meet the machine in the same state.
-void TimePair(benchmark::State& state, const Document& document, Source source) {
-  double load = 0.0;
-  double parse = 0.0;
-  for ([[maybe_unused]] auto _ : state) {
-    parse += SecondsOfParse(document, source);
-    load += SecondsOfLoad(document, source);
-  }
-  const auto count = static_cast<double>(state.iterations());
-  state.counters[kSubjectCounter] = load / count;
-  state.counters[kYardstickCounter] = parse / count;
+  return SecondsOf([&] { Load(vex, document, source); });
 }
 
 std::string Label(const Document& document, Source source) {
   return "load " + document.name + " from " + NameOf(source);
 }
 
-benchmark::internal::Benchmark* RegisterPair(const std::string& name, const Document& document,
-                                             Source source) {
-  return benchmark::RegisterBenchmark(name.c_str(), [&document, source](benchmark::State& state) {
-    TimePair(state, document, source);
-  });
-}
-
-std::string CostLabel(const Document& document) {
-  return "load one of " + document.name;
-}
-
-std::string Thousands(unsigned count) {
-  return std::to_string(count / 1000) + ",000";
+benchmark::internal::Benchmark* Register(const std::string& name, const Document& document,
+                                         Source source) {
+  return RegisterPair(
+      name, [&document, source] { return SecondsOf([&] { Parse(document, source); }); },
+      [&document, source] { return SecondsOfLoad(document, source); });
 }
 
 }  // namespace
+
+std::string LoadBenchmark::CostLabel(const std::string& document) {
+  return "load one of " + document;
+}
 
 LoadBenchmark::LoadBenchmark(const Workspace& workspace) {
   compared_.push_back(workspace.Keep("10,000 samples", SamplesText(10000)));
@@ -91,10 +60,10 @@ LoadBenchmark::LoadBenchmark(const Workspace& workspace) {
     Compare(document);
   }
   for (const Size& size : kSizes) {
-    scaled_.push_back({Thousands(size.samples) + " samples", "", SamplesText(size.samples)});
+    scaled_.push_back({SamplesName(size.samples), "", SamplesText(size.samples)});
   }
   for (std::size_t i = 0; i < scaled_.size(); ++i) {
-    RegisterPair(CostLabel(scaled_[i]), scaled_[i], Source::kStream)
+    Register(CostLabel(scaled_[i].name), scaled_[i], Source::kStream)
         ->Iterations(kSizes[i].iterations)
         ->Repetitions(kSizes[i].repetitions);
   }
@@ -106,7 +75,7 @@ void LoadBenchmark::Compare(const Document& document) {
     std::cerr << "memory: " << label << " ..." << std::endl;
     memory_.push_back(
         {PeakMemory(Task::kLoad, document, source), PeakMemory(Task::kParse, document, source)});
-    RegisterPair(label, document, source)->Iterations(1);
+    Register(label, document, source)->Iterations(1);
   }
 }
 
@@ -130,7 +99,7 @@ Figures LoadBenchmark::Results(const Timings& timings) const {
     }
   }
   for (std::size_t i = 0; i < scaled_.size(); ++i) {
-    const std::string label = CostLabel(scaled_[i]);
+    const std::string label = CostLabel(scaled_[i].name);
     const double cost = timings.SubjectSeconds(label) / kSizes[i].samples / kMicro;
     figures.push_back({label, cost, "us", {}});
     figures.push_back({label + " / bare parse", timings.Ratio(label), "ratio", {}});

@@ -1,6 +1,7 @@
 #ifndef ALDERMOOR_BENCHMARKS_LOADBENCHMARK_H
 #define ALDERMOOR_BENCHMARKS_LOADBENCHMARK_H
 
+#include <string>
 #include <vector>
 
 #include "benchmarks/documents.h"
@@ -20,6 +21,9 @@ class LoadBenchmark {
 
   /// The figures in order, from the times of the registered benchmarks.
   Figures Results(const Timings& timings) const;
+
+  /// The name under which the load of a document with many samples is registered.
+  static std::string CostLabel(const std::string& document);
 
  private:
   struct Memory {

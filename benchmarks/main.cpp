@@ -1,4 +1,5 @@
-// Times and memory of loading documents and of asking samples for colours, in one run.
+// Times and memory of loading and saving documents, and times of asking samples for colours, in one
+// run.
 //
 // Options: "--tsv" for lines to be read by programs, and those of Google Benchmark.
 
@@ -13,6 +14,7 @@
 #include "benchmarks/attributebenchmark.h"
 #include "benchmarks/loadbenchmark.h"
 #include "benchmarks/peakmemory.h"
+#include "benchmarks/storebenchmark.h"
 
 namespace Aldermoor::Benchmarks {
 namespace {
@@ -42,13 +44,15 @@ int Run(int argc, char** argv) {
   const Vexdoc::XMLPlatform platform;
   const Workspace workspace;
   const LoadBenchmark load(workspace);
+  const StoreBenchmark store(workspace);
   RegisterAttributeBenchmarks();
   std::cerr << "times, all benchmarks interleaved ..." << std::endl;
   Timings timings;
   benchmark::RunSpecifiedBenchmarks(&timings);
   Figures figures = load.Results(timings);
-  const Figures attribute = AttributeResults(timings);
-  figures.insert(figures.end(), attribute.begin(), attribute.end());
+  for (const Figures& more : {store.Results(timings), AttributeResults(timings)}) {
+    figures.insert(figures.end(), more.begin(), more.end());
+  }
   if (tsv) {
     PrintTsv(std::cout, figures);
   } else {

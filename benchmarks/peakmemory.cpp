@@ -22,19 +22,20 @@ constexpr int kChildArguments = 5;  // program, flag, task, source, path
 constexpr int kProcesses = 3;
 constexpr double kBytesPerKilobyte = 1024.0;
 
-constexpr std::array<const char*, 3> kTaskNames = {"idle", "parse", "load"};
+constexpr std::array<const char*, 4> kTaskNames = {"idle", "parse", "load", "tree"};
 
-// The high-water mark of this program's own memory.  The figure of getrusage is no use here: it
-// also holds the peak that the process had before it became this program.
-long OwnPeakKilobytes() {
+// "VmHWM" is the high-water mark of this program's own memory, "VmRSS" what it takes now.  The
+// figure of getrusage is no use here: it also holds the peak that the process had before it became
+// this program.
+long OwnKilobytes(std::string_view kind) {
   std::ifstream in("/proc/self/status");
   for (std::string word; in >> word;) {
     long kilobytes = 0;
-    if (word == "VmHWM:" && in >> kilobytes) {
+    if (word.ends_with(':') && word.starts_with(kind) && in >> kilobytes) {
       return kilobytes;
     }
   }
-  throw std::runtime_error("the peak of resident memory cannot be read");
+  throw std::runtime_error("the resident memory cannot be read");
 }
 
 std::string ReadToEnd(int descriptor) {
@@ -93,12 +94,12 @@ int RunChild(char** argv) {
     document.text = ReadFile(document.path);
   }
   Vexdoc::VEX vex;
-  if (task == "load") {
+  if (task == "load" || task == "tree") {
     Load(vex, document, source);
   } else if (task == "parse") {
     Parse(document, source);
   }
-  std::cout << OwnPeakKilobytes() << std::endl;
+  std::cout << OwnKilobytes(task == "tree" ? "VmRSS" : "VmHWM") << std::endl;
   return 0;
 }
 

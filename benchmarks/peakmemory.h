@@ -9,7 +9,9 @@ namespace Aldermoor::Benchmarks {
 
 /// What a child process does before it tells its peak of resident memory.  An idle one only
 /// prepares what the others have before they begin: the XML platform and, for a stream, the text.
-enum class Task { kIdle, kParse, kLoad };
+/// "Tree" loads a file like "load" and tells what is resident in the end instead of the peak; both
+/// take the cache if there is a good one.
+enum class Task { kIdle, kParse, kLoad, kTree };
 
 /// Peak memory of `task` above that of an idle process, in bytes: the median over several child
 /// processes of this same program, each with nothing else on its heap.

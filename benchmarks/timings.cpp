@@ -1,10 +1,35 @@
 #include "benchmarks/timings.h"
 
+#include <ctime>
 #include <stdexcept>
+#include <utility>
 
 #include "benchmarks/figures.h"
 
 namespace Aldermoor::Benchmarks {
+
+double ProcessorSeconds() {
+  std::timespec time{};
+  clock_gettime(CLOCK_PROCESS_CPUTIME_ID, &time);
+  return static_cast<double>(time.tv_sec) + 1e-9 * static_cast<double>(time.tv_nsec);
+}
+
+benchmark::internal::Benchmark* RegisterPair(const std::string& name, Timed yardstick,
+                                             Timed subject) {
+  return benchmark::RegisterBenchmark(
+      name.c_str(),
+      [yardstick = std::move(yardstick), subject = std::move(subject)](benchmark::State& state) {
+        double yardstick_seconds = 0.0;
+        double subject_seconds = 0.0;
+        for ([[maybe_unused]] auto _ : state) {
+          yardstick_seconds += yardstick();
+          subject_seconds += subject();
+        }
+        const auto count = static_cast<double>(state.iterations());
+        state.counters[kSubjectCounter] = subject_seconds / count;
+        state.counters[kYardstickCounter] = yardstick_seconds / count;
+      });
+}
 
 bool Timings::ReportContext(const Context& /*context*/) {
   return true;

@@ -1,6 +1,7 @@
 #ifndef ALDERMOOR_BENCHMARKS_TIMINGS_H
 #define ALDERMOOR_BENCHMARKS_TIMINGS_H
 
+#include <functional>
 #include <map>
 #include <string>
 #include <vector>
@@ -12,6 +13,25 @@ namespace Aldermoor::Benchmarks {
 /// Counters of a benchmark that times two operations in turn, in seconds an iteration.
 inline constexpr const char* kSubjectCounter = "subject";
 inline constexpr const char* kYardstickCounter = "yardstick";
+
+/// Processor time of this process, in seconds.
+double ProcessorSeconds();
+
+/// Processor time of `action`, in seconds.
+template <class Action>
+double SecondsOf(Action action) {
+  const double start = ProcessorSeconds();
+  action();
+  return ProcessorSeconds() - start;
+}
+
+/// An operation that times itself, so that what it prepares and clears away does not count; in
+/// seconds.
+using Timed = std::function<double()>;
+
+/// Registers a subject right after its yardstick, so that both meet the machine in the same state.
+benchmark::internal::Benchmark* RegisterPair(const std::string& name, Timed yardstick,
+                                             Timed subject);
 
 /// Collects what the benchmarks of a run report, by the names under which they were registered.
 ///

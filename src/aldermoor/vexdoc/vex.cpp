@@ -58,7 +58,8 @@ FileStamp StampOf(const File& file) {
 // Whatever is wrong with a cache, the XML file is there.
 bool LoadFromCache(VEX& document, File& cache, const File& xml) {
   try {
-    if (!cache.IsAccessable(false) || !(cache.GetModificationDate() > xml.GetModificationDate())) {
+    // Not by the dates of File: that of a file which cannot be opened for a moment is the present.
+    if (!cache.IsAccessable(false) || !StampOf(cache).IsLaterThan(StampOf(xml))) {
       return false;
     }
     GetBinaryProvider(document)->Read(cache);

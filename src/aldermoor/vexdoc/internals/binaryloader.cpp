@@ -126,11 +126,10 @@ void BinaryLoader::LoadVector(std::vector<float>& target) {
   if (count * sizeof(BinaryFormat::Bytes) > bytes_left_) {
     FailAtEnd("EOF while reading float");
   }
-  std::vector<float> values(count);
-  for (float& value : values) {
+  target.resize(count);
+  for (float& value : target) {
     value = ReadFloat();
   }
-  target.swap(values);
 }
 
 void BinaryLoader::LoadMembers(ColorVector& vector) {

@@ -15,6 +15,7 @@ class FileStamp {
   explicit FileStamp(const std::string& path) {
     struct stat status {};
     if (::stat(path.c_str(), &status) == 0) {
+      is_known_ = true;
       device_ = status.st_dev;
       node_ = status.st_ino;
       size_ = status.st_size;
@@ -25,7 +26,13 @@ class FileStamp {
 
   bool operator==(const FileStamp&) const = default;
 
+  /// Whether the last write came later, by whole seconds; never if one of the two is not known.
+  bool IsLaterThan(const FileStamp& other) const {
+    return is_known_ && other.is_known_ && seconds_ > other.seconds_;
+  }
+
  private:
+  bool is_known_ = false;
   dev_t device_ = 0;
   ino_t node_ = 0;
   off_t size_ = 0;
