@@ -43,7 +43,11 @@ class ALDERMOOR_EXPORT VEX
   Utilities::Tools::SmartPointer<SampleSet> GetSampleSet(const std::string& name) const override;
   /// Writes this document as XML of the current dialect, in UTF-8.  Derived attributes and their
   /// conditions are left out; floats get six significant digits.
-  /// Throws: VexException if the document holds what XML cannot carry.
+  ///
+  /// What a load refuses is written all the same: spectra whose number of points is not that of
+  /// their conditions, and colours of a legacy document without observer (docs/xmlformat.md).
+  /// Throws: VexException if the document holds text that XML cannot carry;
+  /// InvalidArgumentException for a range of wavelengths that is no number.
   void Store(std::ostream& out) const override;
   /// Replaces the content of this document by the XML read from `in`.  Its sets are removed first,
   /// and stay so if the text cannot be read.
@@ -63,7 +67,7 @@ class ALDERMOOR_EXPORT VEX
   /// Files are replaced as a whole: on failure the old file is still there.  The process locale is
   /// changed for the time of the call, so nothing that depends on it may run beside it.
   /// Throws: ResourceNotAvailableException with the system's reason if a file cannot be written;
-  /// VexException if the document holds what XML cannot carry.
+  /// what Store throws.
   void SaveXML(Utilities::FileSystem::File& file, bool updateCache) const;
 
   /// The forms that add or insert keep a copy and return its name, which is another one if the

@@ -1,6 +1,7 @@
 #include "aldermoor/vexdoc/internals/parsebudget.h"
 
 #include <cstdlib>
+#include <new>
 
 #include <malloc.h>
 #include <xercesc/util/OutOfMemoryException.hpp>
@@ -8,8 +9,14 @@
 
 namespace Aldermoor::Vexdoc::Internals {
 
+ParseBudget::~ParseBudget() {
+  while (blocks_.next != &blocks_) {
+    deallocate(blocks_.next + 1);
+  }
+}
+
 void* ParseBudget::allocate(XMLSize_t size) {
-  void* const p = size > limit_ - used_ ? nullptr : std::malloc(size);
+  void* const p = size > limit_ || size + sizeof(Link) > limit_ - used_ ? nullptr : std::malloc(size + sizeof(Link));
   if (p == nullptr) {
     throw xercesc::OutOfMemoryException();
   }
@@ -17,14 +24,20 @@ void* ParseBudget::allocate(XMLSize_t size) {
   if (used_ > limit_) {
     used_ = limit_;  // by the rounding of the allocator; the next one fails
   }
-  return p;
+  Link* const link = new (p) Link{blocks_.former, &blocks_};
+  link->former->next = link;
+  blocks_.former = link;
+  return link + 1;
 }
 
 void ParseBudget::deallocate(void* p) {
   if (p != nullptr) {
-    const std::size_t size = malloc_usable_size(p);
+    Link* const link = static_cast<Link*>(p) - 1;
+    link->former->next = link->next;
+    link->next->former = link->former;
+    const std::size_t size = malloc_usable_size(link);
     used_ -= size < used_ ? size : used_;
-    std::free(p);
+    std::free(link);
   }
 }
 
