@@ -137,12 +137,11 @@ void VEX::LoadXML(const File& file, bool updateCache) try {
 ALDERMOOR_FRAME(Aldermoor::Vexdoc::VEX::LoadXML)
 
 void VEX::SaveXML(File& file, bool updateCache) const try {
-  GetXMLParserAdapter(*this)->Store(file);
+  const FileStamp stamp = GetXMLParserAdapter(*this)->Store(file);
   ApplyTypeCreator(file);
   if (!updateCache) {
     return;
   }
-  const FileStamp stamp = StampOf(file);
   file.GetDirectory().CreateSubdir(kCacheDirectory);
   File cache = GetCacheFile(file);
   GetBinaryProvider(*this)->Write(cache);

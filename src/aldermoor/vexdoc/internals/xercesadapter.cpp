@@ -139,11 +139,11 @@ void XercesAdapter::Store(std::ostream& out) try {
 }
 ALDERMOOR_FRAME(Aldermoor::Vexdoc::Internals::XercesAdapter::Store)
 
-void XercesAdapter::Store(File& file) try {
+Platform::Posix::FileStamp XercesAdapter::Store(File& file) try {
   const LocaleGuard guard(".ACP");
   Platform::Posix::FileReplacement replacement(file.GetAbsolutePlatformName());
   Store(replacement.GetStream());
-  replacement.Commit();
+  return replacement.Commit();
 }
 ALDERMOOR_FRAME(Aldermoor::Vexdoc::Internals::XercesAdapter::Store)
 

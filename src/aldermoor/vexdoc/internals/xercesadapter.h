@@ -41,7 +41,7 @@ class XercesAdapter : public XMLParserAdapter {
   /// The same to a file, which is replaced as a whole.  The locale of the process is changed for
   /// the time of the call.
   /// Throws: ResourceNotAvailableException for a file that cannot be written.
-  void Store(Utilities::FileSystem::File& file) override;
+  Platform::Posix::FileStamp Store(Utilities::FileSystem::File& file) override;
 
   /// The loader for the dialect of a parsed document, which its root's "Version" tells.
   static Utilities::Tools::SmartPointer<XMLLoader> GetLoader(xercesc::DOMDocument* document);

@@ -4,6 +4,7 @@
 #include <iosfwd>
 
 #include "aldermoor/utilities/filesystem/file.h"
+#include "aldermoor/utilities/filesystem/posix/filestamp.h"
 
 namespace Aldermoor::Vexdoc::Internals {
 
@@ -18,7 +19,8 @@ class XMLParserAdapter {
   virtual void Load(std::istream& in) = 0;
   virtual void Load(Utilities::FileSystem::File& file) = 0;
   virtual void Store(std::ostream& out) = 0;
-  virtual void Store(Utilities::FileSystem::File& file) = 0;
+  /// Returns the stamp of the file written, whoever has replaced it since.
+  virtual Platform::Posix::FileStamp Store(Utilities::FileSystem::File& file) = 0;
 };
 
 }  // namespace Aldermoor::Vexdoc::Internals

@@ -112,12 +112,16 @@ void FileReplacement::CopyPermissions(const struct stat& old) {
   }
 }
 
-void FileReplacement::Commit() try {
+FileStamp FileReplacement::Commit() try {
   stream_.flush();
   if (buffer_.GetError() != 0) {
     Fail(buffer_.GetError());
   }
   if (!temporary_.empty() && ::fsync(descriptor_.value) != 0) {
+    Fail(errno);
+  }
+  struct stat status {};
+  if (::fstat(descriptor_.value, &status) != 0) {
     Fail(errno);
   }
   const int closed = ::close(descriptor_.value);
@@ -126,7 +130,7 @@ void FileReplacement::Commit() try {
     Fail(errno);
   }
   if (temporary_.empty()) {
-    return;
+    return FileStamp(status);
   }
   if (::rename(temporary_.c_str(), target_.c_str()) != 0) {
     Fail(errno);
@@ -136,6 +140,7 @@ void FileReplacement::Commit() try {
   if (directory_.value >= 0 && ::fsync(directory_.value) != 0 && errno != EINVAL) {
     Fail(errno);
   }
+  return FileStamp(status);
 }
 ALDERMOOR_FRAME(Aldermoor::Platform::Posix::FileReplacement::Commit)
 

@@ -7,6 +7,7 @@
 #include <sys/stat.h>
 
 #include "aldermoor/utilities/filesystem/posix/descriptorbuffer.h"
+#include "aldermoor/utilities/filesystem/posix/filestamp.h"
 
 namespace Aldermoor::Platform::Posix {
 
@@ -26,8 +27,9 @@ class FileReplacement {
   ~FileReplacement();
 
   std::ostream& GetStream() { return stream_; }
-  /// Nothing may be written afterwards.
-  void Commit();
+  /// Nothing may be written afterwards.  Returns the stamp of what was written, whoever has
+  /// replaced it since.
+  FileStamp Commit();
 
  private:
   // Closed with this object, also where the constructor fails.

@@ -15,14 +15,16 @@ class FileStamp {
   explicit FileStamp(const std::string& path) {
     struct stat status {};
     if (::stat(path.c_str(), &status) == 0) {
-      is_known_ = true;
-      device_ = status.st_dev;
-      node_ = status.st_ino;
-      size_ = status.st_size;
-      seconds_ = status.st_mtim.tv_sec;
-      nanoseconds_ = status.st_mtim.tv_nsec;
+      *this = FileStamp(status);
     }
   }
+  explicit FileStamp(const struct stat& status)
+      : is_known_(true),
+        device_(status.st_dev),
+        node_(status.st_ino),
+        size_(status.st_size),
+        seconds_(status.st_mtim.tv_sec),
+        nanoseconds_(status.st_mtim.tv_nsec) {}
 
   bool operator==(const FileStamp&) const = default;
 
