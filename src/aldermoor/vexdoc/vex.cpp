@@ -76,6 +76,14 @@ void DropCacheOfOldFile(const File& cache, const File& xml, const FileStamp& sta
   }
 }
 
+void RemoveQuietly(const File& file) {
+  try {
+    file.Remove();
+  } catch (...) {
+    // Memory is short, and there is nobody to tell.
+  }
+}
+
 void ApplyTypeCreator(File& file) {
   try {
     file.ApplyMacTypeCreator();
@@ -131,7 +139,7 @@ void VEX::LoadXML(const File& file, bool updateCache) try {
     GetBinaryProvider(*this)->Write(cache);
     DropCacheOfOldFile(cache, file, stamp);
   } catch (...) {
-    cache.Remove();  // the document is loaded all the same
+    RemoveQuietly(cache);  // the document is loaded all the same
   }
 }
 ALDERMOOR_FRAME(Aldermoor::Vexdoc::VEX::LoadXML)

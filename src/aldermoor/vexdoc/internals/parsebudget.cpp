@@ -16,7 +16,11 @@ ParseBudget::~ParseBudget() {
 }
 
 void* ParseBudget::allocate(XMLSize_t size) {
-  void* const p = size > limit_ || size + sizeof(Link) > limit_ - used_ ? nullptr : std::malloc(size + sizeof(Link));
+  if (size > limit_ || size + sizeof(Link) > limit_ - used_) {
+    is_exceeded_ = true;
+    throw xercesc::OutOfMemoryException();
+  }
+  void* const p = std::malloc(size + sizeof(Link));
   if (p == nullptr) {
     throw xercesc::OutOfMemoryException();
   }

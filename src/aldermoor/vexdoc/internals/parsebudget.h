@@ -25,6 +25,8 @@ class ParseBudget : public xercesc::MemoryManager {
 
   /// In bytes.
   std::size_t GetLimit() const { return limit_; }
+  /// Whether the limit is why memory was refused, and not the system.
+  bool IsExceeded() const { return is_exceeded_; }
 
   /// Throws: xercesc::OutOfMemoryException beyond the limit.
   void* allocate(XMLSize_t size) override;
@@ -40,6 +42,7 @@ class ParseBudget : public xercesc::MemoryManager {
 
   std::size_t limit_;
   std::size_t used_ = 0;
+  bool is_exceeded_ = false;
   Link blocks_;
 };
 

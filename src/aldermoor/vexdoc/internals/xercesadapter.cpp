@@ -1,15 +1,12 @@
 #include "aldermoor/vexdoc/internals/xercesadapter.h"
 
 #include <array>
-#include <filesystem>
-#include <fstream>
 #include <istream>
 #include <new>
 #include <vector>
 
 #include <xercesc/dom/DOMDocument.hpp>
 #include <xercesc/dom/DOMException.hpp>
-#include <xercesc/framework/LocalFileInputSource.hpp>
 #include <xercesc/framework/MemBufInputSource.hpp>
 #include <xercesc/util/OutOfMemoryException.hpp>
 #include <xercesc/util/PlatformUtils.hpp>
@@ -17,6 +14,7 @@
 
 #include "aldermoor/utilities/exceptions/exceptions.h"
 #include "aldermoor/utilities/exceptions/frame.h"
+#include "aldermoor/utilities/filesystem/posix/filecontent.h"
 #include "aldermoor/utilities/filesystem/posix/filereplacement.h"
 #include "aldermoor/vexdoc/internals/documentaccess.h"
 #include "aldermoor/vexdoc/internals/documentparser.h"
@@ -63,6 +61,10 @@ std::vector<char> ReadAll(std::istream& in) {
     in.read(chunk.data(), static_cast<std::streamsize>(chunk.size()));
     bytes.insert(bytes.end(), chunk.data(), chunk.data() + in.gcount());
   } while (in);
+  if (in.bad()) {
+    throw ResourceNotAvailableException(
+        "stream cannot be read", ALDERMOOR_HERE(Aldermoor::Vexdoc::Internals::XercesAdapter::Load));
+  }
   return bytes;
 }
 
@@ -97,15 +99,9 @@ void XercesAdapter::Load(File& file) try {
         ALDERMOOR_HERE(Aldermoor::Vexdoc::Internals::XercesAdapter::Load));
   }
   try {
-    if (std::filesystem::is_regular_file(path)) {
-      LoadFrom(
-          xercesc::LocalFileInputSource(XMLChBuffer(path).Get(), XMLPlatformUtils::fgMemoryManager),
-          static_cast<std::size_t>(file.GetSize()));
-    } else {
-      // A pipe gives its bytes once, and a second parse may want them again.
-      std::ifstream in(path, std::ios::binary);
-      LoadFrom(ReadAll(in), path);
-    }
+    // Not by the parser: a pipe gives its bytes once, and a second parse may want them again; and
+    // the parser does not close a file when memory runs out in between.
+    LoadFrom(Platform::Posix::ReadFileContent(path), path);
   } catch (const XMLException& e) {
     throw VexException(
         Filled("An internal XML exception has occurred while loading XML:\n'%REASON%'", "%REASON%",
@@ -158,14 +154,10 @@ SmartPointer<XMLLoader> XercesAdapter::GetLoader(xercesc::DOMDocument* document)
 ALDERMOOR_FRAME(Aldermoor::Vexdoc::Internals::XercesAdapter::GetLoader)
 
 void XercesAdapter::LoadFrom(const std::vector<char>& bytes, const std::string& name) {
-  LoadFrom(
-      xercesc::MemBufInputSource(reinterpret_cast<const XMLByte*>(bytes.data()), bytes.size(),
-                                 XMLChBuffer(name).Get(), false, XMLPlatformUtils::fgMemoryManager),
-      bytes.size());
-}
-
-void XercesAdapter::LoadFrom(const xercesc::InputSource& source, std::size_t bytes) {
-  ParseBudget budget(bytes);
+  const xercesc::MemBufInputSource source(reinterpret_cast<const XMLByte*>(bytes.data()),
+                                          bytes.size(), XMLChBuffer(name).Get(), false,
+                                          XMLPlatformUtils::fgMemoryManager);
+  ParseBudget budget(bytes.size());
   DocumentParser parser(budget);
   try {
     try {
@@ -176,9 +168,12 @@ void XercesAdapter::LoadFrom(const xercesc::InputSource& source, std::size_t byt
       parser.parse(source);
     }
   } catch (const xercesc::OutOfMemoryException&) {
+    if (!budget.IsExceeded()) {
+      throw std::bad_alloc();
+    }
     throw VexParseException("The document takes more memory than the " +
                                 std::to_string(budget.GetLimit()) + " bytes that a text of " +
-                                std::to_string(bytes) + " bytes may take",
+                                std::to_string(bytes.size()) + " bytes may take",
                             ALDERMOOR_HERE(Aldermoor::Vexdoc::Internals::XercesAdapter::Load));
   }
   const SmartPointer<VEX> loaded = GetLoader(parser.getDocument())->Load();

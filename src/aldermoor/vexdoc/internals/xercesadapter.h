@@ -1,7 +1,6 @@
 #ifndef ALDERMOOR_VEXDOC_INTERNALS_XERCESADAPTER_H
 #define ALDERMOOR_VEXDOC_INTERNALS_XERCESADAPTER_H
 
-#include <cstddef>
 #include <string>
 #include <vector>
 
@@ -14,7 +13,6 @@
 
 XERCES_CPP_NAMESPACE_BEGIN
 class DOMDocument;
-class InputSource;
 XERCES_CPP_NAMESPACE_END
 
 namespace Aldermoor::Vexdoc::Internals {
@@ -49,8 +47,6 @@ class XercesAdapter : public XMLParserAdapter {
  private:
   // From memory; failures name the source by `name`.
   void LoadFrom(const std::vector<char>& bytes, const std::string& name);
-  // `bytes` is the size of the source.
-  void LoadFrom(const xercesc::InputSource& source, std::size_t bytes);
 
   VEX* document_;
 };
