@@ -6,22 +6,11 @@
 #include "aldermoor/vexdoc/colorspace.h"
 #include "aldermoor/vexdoc/conditionkeys.h"
 #include "aldermoor/vexdoc/elementvisitor.h"
+#include "aldermoor/vexdoc/mandatoryconditions.h"
 
 namespace Aldermoor::Vexdoc {
 
 using Utilities::Tools::SmartPointer;
-
-namespace {
-
-// Device colours carry no illumination and no observer.
-const std::vector<std::string>& MandatoryConditions(const std::string& color_space) {
-  static const std::vector<std::string> all = {
-      ConditionKeys::kColorSpace, ConditionKeys::kIllumination, ConditionKeys::kObserver};
-  static const std::vector<std::string> type_only = {ConditionKeys::kColorSpace};
-  return color_space == "RGB" || color_space == "CMYK" ? type_only : all;
-}
-
-}  // namespace
 
 ColorVector::ColorVector() = default;
 
@@ -30,7 +19,7 @@ ColorVector::ColorVector(const Conditions& conditions,
     : AbstractSampleAttribute(conditions) {
   if (IsStandardColorSpace()) {
     const std::string color_space = conditions.GetAttribute(ConditionKeys::kColorSpace);
-    ValidateMandatoryConditions(MandatoryConditions(color_space));
+    ValidateMandatoryConditions(MandatoryConditionsOfColors(color_space));
     datastore_ = SmartPointer<ColorScheme>(new ColorSpace(color_space, data));
   } else {
     datastore_ = SmartPointer<ColorScheme>(new ColorScheme(data));
@@ -42,7 +31,7 @@ ColorVector::ColorVector(const Conditions& conditions, const std::vector<float>&
     : AbstractSampleAttribute(conditions) {
   const std::string color_space = conditions.GetAttribute(ConditionKeys::kColorSpace);
   datastore_ = SmartPointer<ColorScheme>(new ColorSpace(color_space, values));
-  ValidateMandatoryConditions(MandatoryConditions(color_space));
+  ValidateMandatoryConditions(MandatoryConditionsOfColors(color_space));
 }
 ALDERMOOR_FRAME(Aldermoor::Vexdoc::ColorVector::ColorVector)
 

@@ -5,6 +5,7 @@
 #include "aldermoor/vexdoc/colorimetrybridge.h"
 #include "aldermoor/vexdoc/conditionkeys.h"
 #include "aldermoor/vexdoc/elementvisitor.h"
+#include "aldermoor/vexdoc/mandatoryconditions.h"
 
 namespace Aldermoor::Vexdoc {
 
@@ -16,13 +17,6 @@ namespace {
 
 constexpr std::size_t kBandCount = 36;
 
-const std::vector<std::string>& MandatoryConditions() {
-  static const std::vector<std::string> keys = {
-      ConditionKeys::kWavelengthMin, ConditionKeys::kWavelengthMax, ConditionKeys::kPointCount,
-      ConditionKeys::kSpectrumType};
-  return keys;
-}
-
 }  // namespace
 
 Spectrum::Spectrum() try : data_(kBandCount, 0.0F) {}
@@ -30,7 +24,7 @@ ALDERMOOR_FRAME(Aldermoor::Vexdoc::Spectrum::Spectrum)
 
 Spectrum::Spectrum(const Conditions& conditions, const std::vector<float>& data) try
     : AbstractSampleAttribute(conditions), data_(data) {
-  ValidateMandatoryConditions(MandatoryConditions());
+  ValidateMandatoryConditions(MandatoryConditionsOfSpectra());
 }
 ALDERMOOR_FRAME(Aldermoor::Vexdoc::Spectrum::Spectrum)
 

@@ -88,5 +88,14 @@ TEST(XmlLoaderTest, ContradictoryEncodingIsAWarningOnStandardOutput) {
   EXPECT_EQ(document.GetName(), "a");
 }
 
+TEST(XmlLoaderTest, XmlVersionThatTheParserKnowsHalfIsAFailureLikeOthers) {
+  VEX document;
+  const std::string text = "<?xml version='1.2'?><VEX Version='1'><Name>a</Name></VEX>";
+  EXPECT_THROW(LoadText(document, text), VexException);
+  const TemporaryDirectory directory;
+  WriteFile(directory / "a.xml", text);
+  EXPECT_THROW(LoadFile(document, directory / "a.xml"), VexException);
+}
+
 }  // namespace
 }  // namespace Aldermoor::Vexdoc::Testing

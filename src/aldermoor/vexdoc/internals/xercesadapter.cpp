@@ -41,6 +41,13 @@ constexpr const char* kStreamName = "VEX";
 
 constexpr const char* kInternalFailure =
     "An internal XML exception has occured while initializing XML:\n%REASON%";
+constexpr const char* kLoadingFailure =
+    "An internal XML exception has occurred while loading XML:\n'%REASON%'";
+
+[[noreturn]] void FailInternally(const char* pattern, const XMLCh* reason) {
+  throw VexException(Filled(pattern, "%REASON%", ToNativeString(reason)),
+                     ALDERMOOR_HERE(Aldermoor::Vexdoc::Internals::XercesAdapter));
+}
 
 void CheckPlatform() {
   if (XMLPlatformUtils::fgMemoryManager == nullptr) {
@@ -77,8 +84,9 @@ void XercesAdapter::Load(std::istream& in) try {
   try {
     LoadFrom(ReadAll(in), kStreamName);
   } catch (const XMLException& e) {
-    throw VexException(Filled(kInternalFailure, "%REASON%", ToNativeString(e.getMessage())),
-                       ALDERMOOR_HERE(Aldermoor::Vexdoc::Internals::XercesAdapter::Load));
+    FailInternally(kInternalFailure, e.getMessage());
+  } catch (const xercesc::DOMException& e) {
+    FailInternally(kInternalFailure, e.getMessage());
   } catch (const VexXMLParseException& e) {
     // Still a VexException to who asks for one, but with the place of the fault.
     throw VexXMLParseException(StreamFailure(e), e.GetFile(), e.GetLine(), e.GetColumn(),
@@ -103,10 +111,9 @@ void XercesAdapter::Load(File& file) try {
     // the parser does not close a file when memory runs out in between.
     LoadFrom(Platform::Posix::ReadFileContent(path), path);
   } catch (const XMLException& e) {
-    throw VexException(
-        Filled("An internal XML exception has occurred while loading XML:\n'%REASON%'", "%REASON%",
-               ToNativeString(e.getMessage())),
-        ALDERMOOR_HERE(Aldermoor::Vexdoc::Internals::XercesAdapter::Load));
+    FailInternally(kLoadingFailure, e.getMessage());
+  } catch (const xercesc::DOMException& e) {  // for an XML version that the parser knows half
+    FailInternally(kLoadingFailure, e.getMessage());
   }
 }
 ALDERMOOR_FRAME(Aldermoor::Vexdoc::Internals::XercesAdapter::Load)
@@ -120,11 +127,9 @@ void XercesAdapter::Store(std::ostream& out) try {
     writer.GetDocument().appendChild(composer.GetCurrentNode());
     writer.Write(out, composer.HasMixedContent());
   } catch (const XMLException& e) {
-    throw VexException(Filled(kInternalFailure, "%REASON%", ToNativeString(e.getMessage())),
-                       ALDERMOOR_HERE(Aldermoor::Vexdoc::Internals::XercesAdapter::Store));
+    FailInternally(kInternalFailure, e.getMessage());
   } catch (const xercesc::DOMException& e) {
-    throw VexException(Filled(kInternalFailure, "%REASON%", ToNativeString(e.getMessage())),
-                       ALDERMOOR_HERE(Aldermoor::Vexdoc::Internals::XercesAdapter::Store));
+    FailInternally(kInternalFailure, e.getMessage());
   } catch (const xercesc::OutOfMemoryException&) {
     throw std::bad_alloc();
   } catch (const VexException& e) {

@@ -1,0 +1,411 @@
+#include "aldermoor/vexdoc/internals/xmlchecker.h"
+
+#include <algorithm>
+#include <iterator>
+#include <stdexcept>
+#include <tuple>
+#include <utility>
+
+#include <xercesc/dom/DOMDocument.hpp>
+#include <xercesc/dom/DOMException.hpp>
+#include <xercesc/dom/DOMNamedNodeMap.hpp>
+#include <xercesc/framework/MemBufInputSource.hpp>
+#include <xercesc/util/OutOfMemoryException.hpp>
+#include <xercesc/util/PlatformUtils.hpp>
+#include <xercesc/util/XMLException.hpp>
+#include <xercesc/util/XMLString.hpp>
+
+#include "aldermoor/utilities/exceptions/frame.h"
+#include "aldermoor/vexdoc/internals/attributerules.h"
+#include "aldermoor/vexdoc/internals/faulttext.h"
+#include "aldermoor/vexdoc/internals/parsebudget.h"
+#include "aldermoor/vexdoc/internals/xerceshelper.h"
+#include "aldermoor/vexdoc/internals/xmlnames.h"
+#include "aldermoor/vexdoc/vexexception.h"
+
+namespace Aldermoor::Vexdoc::Internals {
+
+using xercesc::DOMNode;
+using xercesc::XMLPlatformUtils;
+using xercesc::XMLString;
+
+namespace {
+
+using namespace XMLNames;
+
+constexpr XMLCh kAnyElement[] = u"*";
+
+template <class Visit>
+void ForEachElement(const NodeHolder& parent, const XMLCh* name, Visit visit) {
+  for (NodeHolder child = parent.FindChild(name, false); !child.IsNull();
+       child = child.NextSibling(name, false)) {
+    visit(child);
+  }
+}
+
+std::string NameOf(const NodeHolder& element) {
+  const NodeHolder name = element.FindChild(kName, false);
+  return name.IsNull() ? "" : name.GetText();
+}
+
+// Without the title in front, which says no more than that there is a fault.
+std::string ParseReason(const std::string& message) {
+  return message.substr(message.find('\n') + 1);
+}
+
+bool IsBlank(const XMLCh* text) {
+  return std::all_of(text, text + XMLString::stringLen(text), [](XMLCh c) { return c <= u' '; });
+}
+
+}  // namespace
+
+std::vector<Fault> XMLChecker::Check(std::string_view bytes) try {
+  if (XMLPlatformUtils::fgMemoryManager == nullptr) {
+    throw VexException("The XML platform is not initialised",
+                       ALDERMOOR_HERE(Aldermoor::Vexdoc::Internals::XMLChecker::Check));
+  }
+  try {
+    CheckText(bytes);
+  } catch (const VexXMLParseException& e) {
+    faults_.push_back(
+        {Fault::Severity::kError, ParseReason(e.what()), e.GetLine(), e.GetColumn(), 0});
+  } catch (const xercesc::OutOfMemoryException&) {
+    faults_.push_back({Fault::Severity::kError,
+                       "the document takes more memory than a text of its size may take", 0, 0, 0});
+  } catch (const xercesc::XMLException& e) {
+    faults_.push_back({Fault::Severity::kError, ToNativeString(e.getMessage()), 0, 0, 0});
+  } catch (const xercesc::DOMException& e) {  // for a version "1.2" in the declaration
+    faults_.push_back({Fault::Severity::kError, ToNativeString(e.getMessage()), 0, 0, 0});
+  }
+  std::stable_sort(faults_.begin(), faults_.end(), [](const Fault& a, const Fault& b) {
+    return std::tie(a.line, a.column) < std::tie(b.line, b.column);
+  });
+  return std::move(faults_);
+}
+ALDERMOOR_FRAME(Aldermoor::Vexdoc::Internals::XMLChecker::Check)
+
+void XMLChecker::CheckText(std::string_view bytes) {
+  const xercesc::MemBufInputSource source(reinterpret_cast<const XMLByte*>(bytes.data()),
+                                          bytes.size(), u"VEX");
+  ParseBudget budget(bytes.size());
+  PlacedParser parser(budget);
+  try {
+    parser.parse(source);
+  } catch (const VexException&) {
+    // As a load does: what a document type says about the content keeps nothing from being read.
+    parser.resetDocumentPool();
+    parser.setValidationScheme(xercesc::XercesDOMParser::Val_Never);
+    parser.parse(source);
+  }
+  parser_ = &parser;
+  CheckDocument(NodeHolder(parser.getDocument()));
+  parser_ = nullptr;
+}
+
+void XMLChecker::CheckDocument(const NodeHolder& document) {
+  const NodeHolder root = document.FindChild(kVex, false);
+  if (root.IsNull()) {
+    const NodeHolder other = document.FindChild(kAnyElement, false);
+    return Error(other, "the root is " + Quoted(other.GetName()) + " instead of 'VEX'");
+  }
+  const XMLCh* const version = root.AttributeValue(kVersion);
+  is_legacy_ = version == nullptr || *version == 0;
+  ForEachElement(root, kConditions, [this](const NodeHolder& block) { CheckBlock(block); });
+  CheckHeader(root, true, {kSampleSet, kConditions});
+  std::set<std::string> names;
+  ForEachElement(root, kSampleSet, [this, &names](const NodeHolder& set) {
+    CheckIsFirst(set, "sample set", names);
+    CheckSampleSet(set);
+  });
+  for (const auto& [id, block] : blocks_) {
+    if (!block.is_used) {
+      Warn(block.holder,
+           "no attribute links to the conditions " + Quoted(id) + "; a save drops them");
+    }
+  }
+}
+
+void XMLChecker::CheckBlock(const NodeHolder& block) {
+  Conditions conditions;
+  ForEachElement(block, kAnyElement, [&](const NodeHolder& child) {
+    const DOMNode* const key = child.FirstAttribute();
+    if (child.IsElement(kSpectrum) || (child.IsElement(kId) && key == nullptr)) {
+      return;
+    }
+    if (key == nullptr || *key->getNodeValue() == 0) {
+      return Warn(child, Quoted(child.GetName()) + " is not read: it names no condition");
+    }
+    CheckRun(child);
+    const std::string name = ToNativeString(key->getNodeValue());
+    if (conditions.HasAttribute(name)) {
+      Warn(child, "the condition " + Quoted(name) + " is given again; the last one counts");
+    }
+    conditions.AddAttribute(name, child.GetText());
+  });
+  const NodeHolder id = block.FindChild(kId, false);
+  if (id.IsNull()) {
+    return Error(block, "the conditions have no 'ID'");
+  }
+  CheckRun(id);
+  CheckIllumination(block, id);
+  const std::string text = id.GetText();
+  if (blocks_.contains(text)) {
+    Warn(block, "conditions " + Quoted(text) + " are declared again; the last ones count");
+  }
+  blocks_.insert_or_assign(text, Block{std::move(conditions), block});
+}
+
+void XMLChecker::CheckIllumination(const NodeHolder& block, const NodeHolder& id) {
+  const NodeHolder spectrum = id.NextSibling(kSpectrum, false);
+  ForEachElement(block, kSpectrum, [&](const NodeHolder& other) {
+    if (spectrum.IsNull() || &other.GetXMLNode() != &spectrum.GetXMLNode()) {
+      Warn(other, "'Spectrum' is not read: only the first one behind the 'ID' is");
+    }
+  });
+  if (spectrum.IsNull()) {
+    return;
+  }
+  const auto points = CheckPoints(spectrum);
+  if (points && *points != kIlluminationPoints) {
+    Error(spectrum, "the illumination has " + Counted(*points, "different wavelength") +
+                        " instead of " + std::to_string(kIlluminationPoints));
+  }
+}
+
+void XMLChecker::CheckSampleSet(const NodeHolder& set) {
+  CheckHeader(set, true, {kSample});
+  std::set<std::string> names;
+  ForEachElement(set, kSample, [this, &names](const NodeHolder& sample) {
+    CheckIsFirst(sample, "sample", names);
+    CheckSample(sample);
+  });
+}
+
+void XMLChecker::CheckSample(const NodeHolder& sample) {
+  CheckHeader(sample, true, {kSampleAttribute});
+  ForEachElement(sample, kSampleAttribute,
+                 [this](const NodeHolder& wrapper) { CheckAttribute(wrapper); });
+}
+
+void XMLChecker::CheckAttribute(const NodeHolder& wrapper) {
+  const NodeHolder typed = wrapper.FindChild(kAnyElement, false);
+  if (typed.IsNull()) {
+    return Error(wrapper, "'SampleAttribute' holds no element");
+  }
+  if (const NodeHolder other = typed.NextSibling(kAnyElement, false); !other.IsNull()) {
+    Warn(other, Quoted(other.GetName()) +
+                    " is not read: only the first element of a 'SampleAttribute' is");
+  }
+  const std::string kind = ElementKind(typed.GetName());
+  if (IsLevel(kind)) {
+    return Error(typed, Quoted(typed.GetName()) + " cannot stand in a 'SampleAttribute'");
+  }
+  CheckMembers(kind, typed, CheckLink(typed));
+}
+
+void XMLChecker::CheckMembers(const std::string& kind, const NodeHolder& typed, Block* block) {
+  if (kind == "Spectrum") {
+    CheckSpectrum(typed, block);
+  } else if (kind == "ColorVector") {
+    CheckColor(typed, block);
+  } else if (kind == "Recipe") {
+    CheckRecipe(typed);
+  } else {
+    CheckDataTree(typed);
+  }
+}
+
+void XMLChecker::CheckSpectrum(const NodeHolder& spectrum, Block* block) {
+  CheckHeader(spectrum, false, {kValue});
+  const auto points = CheckPoints(spectrum);
+  if (block == nullptr || is_legacy_) {
+    return;  // legacy spectra have as many points as they have, under whatever conditions
+  }
+  const auto expected = ExpectedPoints(block->conditions);
+  if (!expected) {
+    Error(spectrum, "the number of points in its conditions is no number");
+  } else if (points && *points != *expected) {
+    Error(spectrum, Counted(*points, "different wavelength") + " instead of the " +
+                        std::to_string(*expected) + " of its conditions");
+  }
+  if (!std::exchange(block->is_told, true)) {
+    for (const std::string& fault : SpectrumFaults(block->conditions)) {
+      Warn(block->holder, fault);
+    }
+  }
+}
+
+void XMLChecker::CheckColor(const NodeHolder& color, const Block* block) {
+  CheckHeader(color, false, {kValue});
+  std::size_t channels = 0;
+  ForEachElement(color, kValue, [this, &channels](const NodeHolder& value) {
+    const DOMNode* const attribute = value.FirstAttribute();
+    if (attribute == nullptr || !XMLString::equals(attribute->getNodeName(), kName)) {
+      return Warn(value, "'Value' is not read: its first attribute is not 'Name'");
+    }
+    ++channels;
+    CheckNumber(value);
+  });
+  if (block == nullptr) {
+    return;
+  }
+  for (const std::string& fault : is_legacy_ ? LegacyColorFaults(block->conditions, channels)
+                                             : ColorFaults(block->conditions, channels)) {
+    Error(color, fault);
+  }
+}
+
+void XMLChecker::CheckRecipe(const NodeHolder& recipe) {
+  CheckHeader(recipe, false, {kAssortmentName, kThickness, kSubstrateLinkName, kComponents});
+  if (const NodeHolder thickness = recipe.FindChild(kThickness, false); !thickness.IsNull()) {
+    CheckNumber(thickness);
+  }
+  const NodeHolder list = recipe.FindChild(kComponents, false);
+  if (list.IsNull()) {
+    return;
+  }
+  ForEachElement(list, kAnyElement, [this](const NodeHolder& component) {
+    if (component.FirstAttribute() == nullptr) {
+      Warn(component, "the component is not read: it has no name");
+    } else {
+      CheckNumber(component);
+    }
+  });
+}
+
+// Recursion is bounded by the depth that the parser lets through.
+void XMLChecker::CheckDataTree(const NodeHolder& node) {
+  CheckSingleAttribute(node);
+  CheckRun(node);
+  ForEachElement(node, kAnyElement, [this](const NodeHolder& child) { CheckDataTree(child); });
+}
+
+void XMLChecker::CheckHeader(const NodeHolder& holder, bool is_name_mandatory,
+                             ElementNames others) {
+  std::set<const XMLCh*> seen;
+  bool has_additional_data = false;
+  ForEachElement(holder, kAnyElement, [&](const NodeHolder& child) {
+    const auto key = std::find_if(std::begin(kHeaderKeys), std::end(kHeaderKeys),
+                                  [&](const auto& k) { return child.IsElement(k.element); });
+    if (key != std::end(kHeaderKeys)) {
+      CheckRun(child);
+      if (!seen.insert(key->element).second) {
+        Warn(child, Quoted(key->key) + " is given again; the first one counts");
+      }
+    } else if (child.IsElement(kAdditionalData)) {
+      if (std::exchange(has_additional_data, true)) {
+        Warn(child, "'AdditionalData' is given again; the first one counts");
+      }
+      ForEachElement(child, kAnyElement, [this](const NodeHolder& value) {
+        CheckRun(value);
+        if (value.FirstAttribute() == nullptr) {
+          Warn(value, Quoted(value.GetName()) + " is not read: it has no key");
+        }
+      });
+    } else if (std::none_of(others.begin(), others.end(),
+                            [&](const XMLCh* name) { return child.IsElement(name); })) {
+      Warn(child, Quoted(child.GetName()) + " is not read here");
+    }
+  });
+  if (is_name_mandatory && !seen.contains(kName)) {
+    Error(holder, Quoted(holder.GetName()) + " has no 'Name'");
+  }
+}
+
+void XMLChecker::CheckIsFirst(const NodeHolder& element, const char* noun,
+                              std::set<std::string>& names) {
+  const std::string name = NameOf(element);
+  if (!names.insert(name).second) {
+    Warn(element, "there is a " + std::string(noun) + " " + Quoted(name) +
+                      " already; only the first one is found by that name");
+  }
+}
+
+XMLChecker::Block* XMLChecker::CheckLink(const NodeHolder& typed) {
+  const XMLCh* const link = typed.AttributeValue(kConditions);
+  if (link == nullptr) {
+    Error(typed, Quoted(typed.GetName()) + " has no attribute 'Conditions'");
+    return nullptr;
+  }
+  const std::string id = ToNativeString(link);
+  const auto block = blocks_.find(id);
+  if (block == blocks_.end()) {
+    Error(typed, "links to conditions " + Quoted(id) + ", which the document does not declare");
+    return nullptr;
+  }
+  block->second.is_used = true;
+  return &block->second;
+}
+
+std::optional<std::size_t> XMLChecker::CheckPoints(const NodeHolder& spectrum) {
+  std::set<unsigned int> wavelengths;
+  bool are_numbers = true;
+  ForEachElement(spectrum, kValue, [&](const NodeHolder& value) {
+    const DOMNode* const attribute = value.FirstAttribute();
+    if (attribute == nullptr || !XMLString::equals(attribute->getNodeName(), kName)) {
+      return Warn(value, "'Value' is not read: its first attribute is not 'Name'");
+    }
+    CheckNumber(value);
+    const std::string text = ToNativeString(attribute->getNodeValue());
+    try {
+      const unsigned int wavelength = ReadUnsigned(attribute->getNodeValue());
+      if (text.find_first_not_of("0123456789") != std::string::npos) {
+        Warn(value, "the wavelength " + Quoted(text) + " is read as " + std::to_string(wavelength));
+      }
+      if (!wavelengths.insert(wavelength).second) {
+        Warn(value, "the wavelength " + std::to_string(wavelength) +
+                        " is given again; the first one counts");
+      }
+    } catch (const std::invalid_argument&) {
+      are_numbers = false;
+      Error(value, "the wavelength " + Quoted(text) + " is no number");
+    }
+  });
+  return are_numbers ? std::make_optional(wavelengths.size()) : std::nullopt;
+}
+
+void XMLChecker::CheckNumber(const NodeHolder& holder) {
+  CheckRun(holder);
+  if (const std::string fault = NumberFault(holder.GetText()); !fault.empty()) {
+    Warn(holder, fault + "; it is read as " + NumberText(holder.GetFloat()));
+  }
+}
+
+void XMLChecker::CheckRun(const NodeHolder& holder) {
+  bool is_first = true;
+  for (const DOMNode* child = holder.GetXMLNode().getFirstChild(); child != nullptr;
+       child = child->getNextSibling()) {
+    const bool is_text = child->getNodeType() == DOMNode::TEXT_NODE;
+    if (is_text && std::exchange(is_first, false)) {
+      continue;
+    }
+    if ((is_text || child->getNodeType() == DOMNode::CDATA_SECTION_NODE) &&
+        !IsBlank(child->getNodeValue())) {
+      return Warn(holder, "the text of " + Quoted(holder.GetName()) +
+                              " is read up to the first element, comment or CDATA section only");
+    }
+  }
+}
+
+void XMLChecker::CheckSingleAttribute(const NodeHolder& holder) {
+  const xercesc::DOMNamedNodeMap* const attributes = holder.GetXMLNode().getAttributes();
+  if (attributes->getLength() > 1) {
+    Warn(holder, "of the attributes of " + Quoted(holder.GetName()) + " only " +
+                     Quoted(ToNativeString(attributes->item(0)->getNodeName())) + " is kept");
+  }
+}
+
+void XMLChecker::Add(Fault::Severity severity, const NodeHolder& holder, const std::string& text) {
+  const Place place = parser_->GetPlace(holder.GetXMLNode());
+  faults_.push_back({severity, text, place.line, place.column, 0});
+}
+
+void XMLChecker::Error(const NodeHolder& holder, const std::string& text) {
+  Add(Fault::Severity::kError, holder, text);
+}
+
+void XMLChecker::Warn(const NodeHolder& holder, const std::string& text) {
+  Add(Fault::Severity::kWarning, holder, text);
+}
+
+}  // namespace Aldermoor::Vexdoc::Internals

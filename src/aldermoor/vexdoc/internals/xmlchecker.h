@@ -1,0 +1,75 @@
+#ifndef ALDERMOOR_VEXDOC_INTERNALS_XMLCHECKER_H
+#define ALDERMOOR_VEXDOC_INTERNALS_XMLCHECKER_H
+
+#include <initializer_list>
+#include <map>
+#include <optional>
+#include <set>
+#include <string>
+#include <string_view>
+#include <vector>
+
+#include "aldermoor/vexdoc/conditions.h"
+#include "aldermoor/vexdoc/inspection.h"
+#include "aldermoor/vexdoc/internals/nodeholder.h"
+#include "aldermoor/vexdoc/internals/placedparser.h"
+
+namespace Aldermoor::Vexdoc::Internals {
+
+/// Walks over the DOM of a document as XMLLoader and LegacyLoader do, but builds nothing and goes
+/// on behind a fault.  Whatever makes a loader throw is an error here.  Serves one document.
+class XMLChecker {
+ public:
+  /// Throws: VexException if the XML platform is not initialised.
+  std::vector<Fault> Check(std::string_view bytes);
+
+ private:
+  // A block of the document that declares an ID.
+  struct Block {
+    Conditions conditions;
+    NodeHolder holder;
+    bool is_used = false;
+    bool is_told = false;  // what it lacks for a spectrum
+  };
+  using ElementNames = std::initializer_list<const XMLCh*>;
+
+  void CheckText(std::string_view bytes);
+  void CheckDocument(const NodeHolder& document);
+  void CheckBlock(const NodeHolder& block);
+  void CheckIllumination(const NodeHolder& block, const NodeHolder& id);
+  void CheckSampleSet(const NodeHolder& set);
+  void CheckSample(const NodeHolder& sample);
+  void CheckAttribute(const NodeHolder& wrapper);
+  // `block` is null after a fault of the link.
+  void CheckMembers(const std::string& kind, const NodeHolder& typed, Block* block);
+  void CheckSpectrum(const NodeHolder& spectrum, Block* block);
+  void CheckColor(const NodeHolder& color, const Block* block);
+  void CheckRecipe(const NodeHolder& recipe);
+  void CheckDataTree(const NodeHolder& node);
+
+  // The header elements, and that there are no children but those and the `others`.
+  void CheckHeader(const NodeHolder& holder, bool is_name_mandatory, ElementNames others);
+  // That `names` does not hold the name of the element yet.
+  void CheckIsFirst(const NodeHolder& element, const char* noun, std::set<std::string>& names);
+  // The block to which an attribute links; null after a fault.
+  Block* CheckLink(const NodeHolder& typed);
+  // How many different wavelengths there are; none after an error among them.
+  std::optional<std::size_t> CheckPoints(const NodeHolder& spectrum);
+  void CheckNumber(const NodeHolder& holder);
+  // That nothing stands behind the first run of text, which is all that is read.
+  void CheckRun(const NodeHolder& holder);
+  void CheckSingleAttribute(const NodeHolder& holder);
+
+  void Add(Fault::Severity severity, const NodeHolder& holder, const std::string& text);
+  void Error(const NodeHolder& holder, const std::string& text);
+  void Warn(const NodeHolder& holder, const std::string& text);
+
+  const PlacedParser* parser_ = nullptr;
+  bool is_legacy_ = false;
+  std::map<std::string, Block> blocks_;  // by the ID in the file
+  std::vector<Fault> faults_;
+};
+
+}  // namespace Aldermoor::Vexdoc::Internals
+
+#endif  // ALDERMOOR_VEXDOC_INTERNALS_XMLCHECKER_H
