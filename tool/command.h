@@ -25,8 +25,14 @@ class Command {
 };
 
 // Each of these stands in the file of its subcommand.
+std::unique_ptr<Command> MakeCacheCommand();
+std::unique_ptr<Command> MakeCheckCommand();
 std::unique_ptr<Command> MakeColorCommand();
+std::unique_ptr<Command> MakeConvertCommand();
+std::unique_ptr<Command> MakeDumpCommand();
+std::unique_ptr<Command> MakeExtractCommand();
 std::unique_ptr<Command> MakeInfoCommand();
+std::unique_ptr<Command> MakeMergeCommand();
 
 }  // namespace Aldermoor::Tool
 

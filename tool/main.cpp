@@ -40,12 +40,34 @@ constexpr CommandEntry kCommands[] = {
      "  aldermoor color chart.xml --set Ramp --sample \"Cyan 50\" --format json\n"
      "  aldermoor color - --format csv --output chart.csv < chart.xml\n",
      &MakeColorCommand},
+    {"convert", "Turn XML into CSV, CSV into XML, or either into its own form anew",
+     "  aldermoor convert legacy.xml new.xml --condition Colorimetric.Observer=TwoDegree\n"
+     "  aldermoor convert chart.csv chart.xml --percent --set Chart\n"
+     "  aldermoor convert chart.xml chart.csv --separator semicolon\n"
+     "  aldermoor convert - - --from csv --to xml < chart.csv > chart.xml\n",
+     &MakeConvertCommand},
+    {"merge", "Put the sets of several documents into one",
+     "  aldermoor merge a.xml b.xml -o all.xml\n", &MakeMergeCommand},
+    {"extract", "Write a document of some sets or samples alone",
+     "  aldermoor extract chart.xml --set Ramp -o ramp.xml\n"
+     "  aldermoor extract chart.xml --sample \"Cyan 50\" -o -\n",
+     &MakeExtractCommand},
+    {"cache", "Show, rebuild or remove the caches beside documents",
+     "  aldermoor cache chart.xml\n"
+     "  aldermoor cache --rebuild *.xml\n",
+     &MakeCacheCommand},
+    {"check", "Tell everything that is wrong with documents and caches",
+     "  aldermoor check chart.xml Cache/chart.vexb\n"
+     "  aldermoor check --format json *.xml\n",
+     &MakeCheckCommand},
+    {"dump", "Show the bytes of a cache with their meaning", "  aldermoor dump Cache/chart.vexb\n",
+     &MakeDumpCommand},
 };
 
 constexpr const char* kExitStatusText =
     "Exit status:\n"
     "  0  everything was done\n"
-    "  1  some samples failed, or no sample matched\n"
+    "  1  some samples failed, no sample matched, or a file has faults\n"
     "  2  wrong usage; nothing was computed\n"
     "  3  an input could not be read; the others were processed\n"
     "  4  the output could not be written\n";

@@ -1,0 +1,90 @@
+#include <gtest/gtest.h>
+
+#include "toolrun.h"
+
+namespace Aldermoor::Tool {
+namespace {
+
+const std::string kUnknown =
+    "<Sample><Name>u</Name><SampleAttribute><Gloss Conditions='1' Angle='60'><Deep>7</Deep></Gloss>"
+    "</SampleAttribute></Sample>";
+
+class DocumentsTest : public ToolTest {
+ protected:
+  DocumentsTest() {
+    WriteDocument("a.xml", "Set", SampleXml("x", 0.5) + SampleXml("y", 0.25));
+    WriteDocument("b.xml", "Set", kUnknown + LabSampleXml("x", "50", "20", "10"));
+    WriteFile("old.xml", "old");
+  }
+};
+
+TEST_F(DocumentsTest, MergeKeepsAllSetsAndTellsTheNewNames) {
+  EXPECT_EQ(Shell("sed 's/Run 1/Run 2/' b.xml > c.xml").status, 0);
+  const Result result = Run("merge a.xml b.xml c.xml -o all.xml");
+  EXPECT_EQ(result.status, 0);
+  EXPECT_EQ(result.err,
+            "aldermoor: b.xml: the set 'Set' becomes 'Set (1)'\n"
+            "aldermoor: c.xml: the values of its header are left out where the first document has "
+            "others: Name\n"
+            "aldermoor: c.xml: the set 'Set' becomes 'Set (2)'\n");
+  const std::string info = Run("info all.xml").out;
+  EXPECT_TRUE(Holds(info, "Run 1\n  3 sets, 6 samples\n    Set: 2 samples\n    Set (1): 2"));
+  EXPECT_TRUE(Holds(info, "conditions 2, used by 2 attributes\n")) << "conditions are shared";
+  EXPECT_TRUE(Holds(ReadFile("all.xml"), "<Gloss Angle=\"60\"")) << "unknown content";
+  EXPECT_EQ(Run("merge a.xml -o - | cat").out, Run("convert a.xml -").out);
+}
+
+TEST_F(DocumentsTest, NothingIsWrittenFromWhatCannotBeReadOrDoesNotMatch) {
+  const struct {
+    const char* arguments;
+    int status;
+    const char* text;
+  } cases[] = {
+      {"merge a.xml old.xml", 3, "old.xml:1:1: "},
+      {"merge - a.xml -", 2, "only once"},
+      {"extract a.xml", 2, "--set or --sample"},
+      {"extract a.xml --sample z", 1, "a.xml: no sample 'z'"},
+      {"extract a.xml --set Nix", 1, "no samples in a set 'Nix'"},
+  };
+  for (const auto& one : cases) {
+    const Result result = Run(std::string(one.arguments) + " -o old.xml");
+    EXPECT_EQ(result.status, one.status) << one.arguments;
+    EXPECT_TRUE(Holds(result.err, one.text));
+    EXPECT_EQ(ReadFile("old.xml"), "old");
+  }
+}
+
+TEST_F(DocumentsTest, ExtractKeepsWhatPassesAndTheHeader) {
+  ASSERT_EQ(Run("merge a.xml b.xml -o all.xml").status, 0);
+  EXPECT_EQ(Run("extract all.xml --sample y -o y.xml").status, 0);
+  EXPECT_TRUE(Holds(Run("info y.xml").out, "Run 1\n  1 set, 1 sample\n    Set: 1 sample\n"))
+      << "sets without a match go";
+  EXPECT_EQ(Run("extract all.xml --set 'Set (1)' -o u.xml").status, 0);
+  EXPECT_TRUE(Holds(ReadFile("u.xml"), "<Deep>7</Deep>"));
+  EXPECT_TRUE(Holds(Run("info u.xml").out, "  1 set, 2 samples\n"));
+  WriteFile("empty.xml", "<VEX Version='1'><Name/><SampleSet><Name>E</Name></SampleSet></VEX>");
+  EXPECT_EQ(Run("extract empty.xml --set E -o e.xml").status, 0) << "an empty set that is named";
+}
+
+TEST_F(DocumentsTest, CacheIsRebuiltUsedAndRemoved) {
+  EXPECT_EQ(Run("cache a.xml").out, "a.xml: Cache/a.vexb: not used: absent\n");
+  EXPECT_TRUE(Holds(Run("cache --rebuild a.xml").out, ": used\n"));
+  // What is read now can only come from the cache.
+  EXPECT_EQ(
+      Shell("touch -r a.xml t; echo x > a.xml; touch -r t a.xml; aldermoor info a.xml").status, 0);
+  const Result kept = Run("cache --rebuild a.xml nix.xml");
+  EXPECT_EQ(kept.status, 3);
+  EXPECT_TRUE(Holds(kept.err, "nix.xml: No such file"));
+  EXPECT_EQ(Run("info a.xml").status, 0) << "the cache outlives a document that cannot be read";
+  EXPECT_EQ(Shell("touch -r Cache/a.vexb a.xml").status, 0);
+  EXPECT_TRUE(Holds(Run("cache a.xml").out, "not used: not later than the document"));
+  EXPECT_EQ(Shell("truncate -s 40 Cache/a.vexb; touch -d '+9 sec' Cache/a.vexb").status, 0);
+  EXPECT_TRUE(Holds(Run("cache a.xml").out, "Cache/a.vexb, 40 bytes, "));
+  EXPECT_TRUE(Holds(Run("cache a.xml").out, "not used: broken at 0x"));
+  EXPECT_EQ(Run("cache --remove a.xml").out, "a.xml: Cache/a.vexb: removed\n");
+  EXPECT_EQ(Shell("mv b.xml b.paper.XML; aldermoor cache b.paper.XML").out,
+            "b.paper.XML: Cache/b.paper.vexb: not used: absent\n");
+}
+
+}  // namespace
+}  // namespace Aldermoor::Tool

@@ -1,0 +1,138 @@
+#include "settings.h"
+
+#include <algorithm>
+#include <charconv>
+#include <system_error>
+#include <vector>
+
+#include <fmt/format.h>
+#include <fmt/ranges.h>
+
+#include "diagnostics.h"
+#include "exitstatus.h"
+#include "vocabulary.h"
+
+namespace Aldermoor::Tool {
+namespace {
+
+constexpr std::string_view kSpectrumPrefix = "Spectrum.";
+constexpr std::string_view kColorPrefix = "Color.";
+
+std::string_view Trimmed(std::string_view text) {
+  const std::size_t first = std::min(text.find_first_not_of(' '), text.size());
+  return text.substr(first, text.find_last_not_of(' ') + 1 - first);
+}
+
+bool IsWavelengthKey(const std::string& key) {
+  return key == kWavelengthMinKey || key == kWavelengthMaxKey;
+}
+
+// `value` in the form that the library reads.
+std::string Checked(const std::string& what, const std::string& key, const std::string& value) {
+  if (!IsWavelengthKey(key)) {
+    return ConditionValue(what, key, value);
+  }
+  if (!Wavelength(value)) {
+    throw UsageError(fmt::format("{}: '{}' is no whole wavelength such as 380nm", what, value));
+  }
+  return value;
+}
+
+}  // namespace
+
+std::optional<Setting> Setting::Parse(std::string_view text) {
+  const std::size_t equals = text.find('=');
+  if (equals == std::string_view::npos || equals == 0) {
+    return std::nullopt;
+  }
+  return Setting{std::string(text.substr(0, equals)), std::string(text.substr(equals + 1))};
+}
+
+std::optional<int> Wavelength(std::string_view text) {
+  if (text.ends_with("nm")) {
+    text.remove_suffix(2);
+  }
+  int wavelength = 0;
+  const auto [end, error] = std::from_chars(text.data(), text.data() + text.size(), wavelength);
+  if (error != std::errc() || end != text.data() + text.size()) {
+    return std::nullopt;
+  }
+  return wavelength;
+}
+
+bool IsOfSpectrum(std::string_view key) {
+  return key.starts_with("Physical.") || key == kCustomKey;
+}
+
+bool IsOfColor(std::string_view key) {
+  return key.starts_with("Color") || key == kCustomKey;
+}
+
+bool IsInVocabulary(const std::string& key, const std::string& value) {
+  if (!WordsFor(key)) {
+    return false;
+  }
+  if (key == kIlluminationKey && value.starts_with("Dxx")) {
+    return false;  // its temperature would be checked, with a message
+  }
+  try {
+    return Checked("", key, value) == value;
+  } catch (const UsageError&) {
+    return false;
+  }
+}
+
+void KindConditions::Add(const std::string& what, const Setting& setting) {
+  if (setting.key.starts_with(kSpectrumPrefix)) {
+    AddAnyText(what, setting.key.substr(kSpectrumPrefix.size()), setting.value, spectrum);
+    return;
+  }
+  if (setting.key.starts_with(kColorPrefix)) {
+    AddAnyText(what, setting.key.substr(kColorPrefix.size()), setting.value, color);
+    return;
+  }
+  const std::string key(Trimmed(setting.key));
+  if (!WordsFor(key)) {
+    throw UsageError(fmt::format(
+        "{}: '{}' is not one of {}; a key of your own is written Spectrum.KEY or Color.KEY", what,
+        key, fmt::join(AllKeys(), ", ")));
+  }
+  const std::string value = Checked(what + " " + key, key, std::string(Trimmed(setting.value)));
+  if (IsOfSpectrum(key)) {
+    spectrum.emplace(key, value);
+  }
+  if (IsOfColor(key)) {
+    color.emplace(key, value);
+  }
+}
+
+void KindConditions::AddAnyText(const std::string& what, const std::string& key,
+                                const std::string& value, Texts& conditions) {
+  if (key.empty()) {
+    throw UsageError(fmt::format("{}: a condition without a key", what));
+  }
+  if (WordsFor(key) && !IsInVocabulary(key, value) && !value.starts_with("Dxx")) {
+    Report(fmt::format("{}: '{}' is no word of {}; it is taken as it is", what, value, key));
+  }
+  conditions.emplace(key, value);
+}
+
+void ConditionOption::AddTo(CLI::App& app) {
+  app.add_option("--condition", texts,
+                 "Condition as KEY=VALUE, for what the input does not give; may be repeated.  "
+                 "Spectrum.KEY=VALUE and Color.KEY=VALUE take any key and text")
+      ->type_name("KEY=VALUE")
+      ->allow_extra_args(false);
+}
+
+void ConditionOption::ApplyTo(KindConditions& conditions) const {
+  for (const std::string& text : texts) {
+    const std::optional<Setting> setting = Setting::Parse(text);
+    if (!setting) {
+      throw UsageError(fmt::format("--condition: '{}' is not of the form KEY=VALUE", text));
+    }
+    conditions.Add("--condition", *setting);
+  }
+}
+
+}  // namespace Aldermoor::Tool
