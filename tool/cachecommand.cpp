@@ -8,6 +8,7 @@
 #include <thread>
 #include <vector>
 
+#include <CLI/CLI.hpp>
 #include <fmt/format.h>
 #include <sys/stat.h>
 

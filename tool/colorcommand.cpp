@@ -8,6 +8,7 @@
 #include <utility>
 #include <vector>
 
+#include <CLI/CLI.hpp>
 #include <fmt/format.h>
 
 #include "aldermoor/utilities/tools/smartpointer.h"

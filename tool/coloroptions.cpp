@@ -1,5 +1,6 @@
 #include "coloroptions.h"
 
+#include <CLI/CLI.hpp>
 #include <fmt/format.h>
 #include <fmt/ranges.h>
 

@@ -5,9 +5,11 @@
 #include <string>
 #include <vector>
 
-#include <CLI/CLI.hpp>
-
 #include "aldermoor/vexdoc/conditions.h"
+
+namespace CLI {
+class App;
+}
 
 namespace Aldermoor::Tool {
 

@@ -3,9 +3,11 @@
 
 #include <memory>
 
-#include <CLI/CLI.hpp>
-
 #include "exitstatus.h"
+
+namespace CLI {
+class App;
+}
 
 namespace Aldermoor::Tool {
 

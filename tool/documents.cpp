@@ -9,6 +9,7 @@
 #include <sstream>
 #include <system_error>
 
+#include <CLI/CLI.hpp>
 #include <fmt/format.h>
 
 #include "aldermoor/utilities/filesystem/file.h"

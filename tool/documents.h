@@ -6,11 +6,13 @@
 #include <string>
 #include <vector>
 
-#include <CLI/CLI.hpp>
-
 #include "aldermoor/vexdoc/vex.h"
 
 #include "exitstatus.h"
+
+namespace CLI {
+class App;
+}
 
 namespace Aldermoor::Tool {
 

@@ -7,6 +7,8 @@
 #include <string>
 #include <string_view>
 
+#include <CLI/CLI.hpp>
+
 #include "aldermoor/vexdoc/inspection.h"
 
 #include "command.h"

@@ -4,6 +4,7 @@
 #include <cstddef>
 #include <utility>
 
+#include <CLI/CLI.hpp>
 #include <fmt/format.h>
 
 #include "exitstatus.h"

@@ -9,9 +9,11 @@
 #include <variant>
 #include <vector>
 
-#include <CLI/CLI.hpp>
-
 #include "output.h"
+
+namespace CLI {
+class App;
+}
 
 namespace Aldermoor::Tool {
 

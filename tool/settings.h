@@ -5,8 +5,11 @@
 #include <optional>
 #include <string>
 #include <string_view>
+#include <vector>
 
-#include <CLI/CLI.hpp>
+namespace CLI {
+class App;
+}
 
 namespace Aldermoor::Tool {
 

@@ -2,45 +2,25 @@
 
 #include <cmath>
 #include <limits>
-#include <sstream>
 
 #include <gtest/gtest.h>
 
-#include "aldermoor/vexdoc/internals/binarydumper.h"
-#include "aldermoor/vexdoc/internals/binaryloader.h"
-#include "aldermoor/vexdoc/internals/conditionmanager.h"
 #include "aldermoor/vexdoc/recipe.h"
 #include "aldermoor/vexdoc/vexexception.h"
 
 #include "tests/vexdoc/internals/documenttext.h"
 #include "tests/vexdoc/internals/loadsupport.h"
+#include "tests/vexdoc/internals/writesupport.h"
 #include "tests/vexdoc/support.h"
 
 namespace Aldermoor::Vexdoc::Testing {
 namespace {
 
-using Internals::BinaryDumper;
-using Internals::BinaryLoader;
-using Internals::ConditionManager;
 using namespace Vexdoc::Tests;
 using Utilities::Exceptions::ResourceNotAvailableException;
 
-std::string XmlOf(const VEX& document) {
-  std::ostringstream out;
-  document.Store(out);
-  return out.str();
-}
-
-std::string CacheOf(const VEX& document) {
-  std::ostringstream out;
-  BinaryDumper dumper(out);
-  const_cast<VEX&>(document).AcceptVisitor(dumper);  // the dumper only reads
-  return out.str();
-}
-
 std::string LoadedText(const std::string& cache) {
-  std::istringstream in(cache);
-  return DocumentText(*BinaryLoader(in).Load());
+  return DocumentText(*LoadedCache(cache));
 }
 
 // Why a cache is not read, whatever the class of the exception.
@@ -310,8 +290,7 @@ TEST(BinaryTest, AllBitsOfFloatsAndAllBytesOfTextsTravel) {
   document.AddSample("s", Sample(name));
   document.FindSample("s", name)->AddSampleAttribute(Shared(Spectrum(SpectrumConditions(), data)));
   document.SetAttribute(std::string("k\0", 2), std::string("\0v", 2));
-  std::istringstream in(CacheOf(document));
-  const auto loaded = BinaryLoader(in).Load();
+  const auto loaded = LoadedCache(CacheOf(document));
   EXPECT_EQ(loaded->GetAttributes(), document.GetAttributes());
   EXPECT_EQ(DocumentText(*loaded), DocumentText(document));
   EXPECT_EQ(CacheOf(*loaded), CacheOf(document));
@@ -320,8 +299,7 @@ TEST(BinaryTest, AllBitsOfFloatsAndAllBytesOfTextsTravel) {
 TEST(BinaryTest, AllKindsShareTheBlocksAfterALoad) {
   const auto shared = Shared(Recipe(With({{"AllKindsShare", "1"}}), "", 0, "", {}));
   const VEX document = DocumentWith({shared, Shared(Lab(1, 2, 3))});
-  std::istringstream in(CacheOf(document));
-  const auto loaded = BinaryLoader(in).Load();
+  const auto loaded = LoadedCache(CacheOf(document));
   const auto& attributes = loaded->FindSample("s", "t")->GetElements();
   EXPECT_TRUE(IsSame(attributes.front().second->GetConditions(), shared->GetConditions()));
   EXPECT_EQ(*attributes.back().second, Lab(1, 2, 3));
