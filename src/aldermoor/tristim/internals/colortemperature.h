@@ -16,7 +16,7 @@ namespace Aldermoor::Tristim::Internals {
 class ColorTemperature {
  public:
   /// In whole kelvin; -1 if the light is not between the ends of the search, stands exactly on the
-  /// locus, or has no chromaticity.
+  /// locus, or has no chromaticity.  Black has that of equal energy, and so about 5456 K.
   [[nodiscard]] float GetColorTemperature(const HXSpectrum& spectrum) const;
 
   /// Spectral radiance in W per m3 and sr; `temperature` in kelvin.
