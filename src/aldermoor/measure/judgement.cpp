@@ -35,11 +35,17 @@ ALDERMOOR_FRAME(Aldermoor::Measure::ColorFamily)
 
 float MetamerismIndex(const Spectrum& first, const Spectrum& second, const Conditions& conditions,
                       const Conditions& testConditions) try {
+  const Tristim::HXMeasureConditions test = Vexdoc::ToMeasureConditions(testConditions);
+  // Of the test light its name alone is looked at, so that a curve would be lost.
+  if (test.GetIllumination().GetIlluminationType() == Tristim::IlluminationType::kUserdefined) {
+    throw MeasureException("the metamerism index needs a test light that has a name",
+                           ALDERMOOR_HERE(Aldermoor::Measure::MetamerismIndex));
+  }
   return Computed(
       [&] {
-        return TristimService::GetMetamery(
-            Vexdoc::ToHXSpectrum(first), Vexdoc::ToHXSpectrum(second),
-            Vexdoc::ToMeasureConditions(conditions), Vexdoc::ToMeasureConditions(testConditions));
+        return TristimService::GetMetamery(Vexdoc::ToHXSpectrum(first),
+                                           Vexdoc::ToHXSpectrum(second),
+                                           Vexdoc::ToMeasureConditions(conditions), test);
       },
       [&] { return ReasonOfFailure(conditions, "the metamerism index"); });
 }

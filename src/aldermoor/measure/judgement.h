@@ -19,7 +19,8 @@ ALDERMOOR_EXPORT std::string ColorFamily(const Vexdoc::Spectrum& spectrum);
 /// How far two samples drift apart under the illumination of `testConditions` that match under
 /// `conditions`, as CIELab difference.  A difference that is there under `conditions` already is
 /// divided out of XYZ, so it need not be 0.
-/// Throws: MeasureException with the reason.  Source: CIE 15:2004, 9.2.
+/// Throws: MeasureException with the reason, also for a test light "Userdefined".
+/// Source: CIE 15:2004, 9.2.
 ALDERMOOR_EXPORT float MetamerismIndex(const Vexdoc::Spectrum& first,
                                        const Vexdoc::Spectrum& second,
                                        const Vexdoc::Conditions& conditions,

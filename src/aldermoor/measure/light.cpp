@@ -13,7 +13,10 @@ using Vexdoc::Spectrum;
 std::optional<float> ColorTemperature(const Spectrum& light) try {
   return Computed(
       [&]() -> std::optional<float> {
-        const float kelvin = TristimService::GetColorTemperature(Vexdoc::ToHXSpectrum(light));
+        const Tristim::HXSpectrum spectrum = Vexdoc::ToHXSpectrum(light);
+        // Darkness would have the chromaticity of equal energy, and so its temperature.
+        const float kelvin =
+            spectrum.IsValid() ? TristimService::GetColorTemperature(spectrum) : -1.0F;
         return kelvin > 0.0F ? std::optional<float>(kelvin) : std::nullopt;
       },
       [&] { return ReasonOfFailure(*light.GetConditions(), "the colour temperature"); });
