@@ -28,6 +28,10 @@ class Command {
 std::unique_ptr<Command> MakeColorCommand();
 std::unique_ptr<Command> MakeInfoCommand();
 
+std::unique_ptr<Command> MakeDiffCommand();
+std::unique_ptr<Command> MakeMetamerismCommand();
+std::unique_ptr<Command> MakeSpectrumCommand();
+
 }  // namespace Aldermoor::Tool
 
 #endif  // ALDERMOOR_TOOL_COMMAND_H

@@ -40,12 +40,24 @@ constexpr CommandEntry kCommands[] = {
      "  aldermoor color chart.xml --set Ramp --sample \"Cyan 50\" --format json\n"
      "  aldermoor color - --format csv --output chart.csv < chart.xml\n",
      &MakeColorCommand},
+    {"diff", "Compare the samples of documents with those of a reference",
+     "  aldermoor diff reference.xml print.xml\n"
+     "  aldermoor diff reference.xml run1.xml run2.xml --summary --limit 3\n"
+     "  aldermoor diff reference.xml print.xml --formula CMC --weights 2,1 --format csv\n",
+     &MakeDiffCommand},
+    {"metamerism", "Tell how far pairs of samples drift apart under other lights",
+     "  aldermoor metamerism original.xml copy.xml --reference D65 --test A,F11\n",
+     &MakeMetamerismCommand},
+    {"spectrum", "Find reflectance spectra for given colours",
+     "  aldermoor spectrum 50,20,10 --illuminant D65\n"
+     "  aldermoor spectrum --input colours.xml --save spectra.xml\n",
+     &MakeSpectrumCommand},
 };
 
 constexpr const char* kExitStatusText =
     "Exit status:\n"
     "  0  everything was done\n"
-    "  1  some samples failed, or no sample matched\n"
+    "  1  some samples failed, no sample matched, or a limit was exceeded\n"
     "  2  wrong usage; nothing was computed\n"
     "  3  an input could not be read; the others were processed\n"
     "  4  the output could not be written\n";
