@@ -28,7 +28,10 @@ class Command {
 std::unique_ptr<Command> MakeColorCommand();
 std::unique_ptr<Command> MakeInfoCommand();
 
+std::unique_ptr<Command> MakeClassifyCommand();
+std::unique_ptr<Command> MakeDensityCommand();
 std::unique_ptr<Command> MakeDiffCommand();
+std::unique_ptr<Command> MakeLightCommand();
 std::unique_ptr<Command> MakeMetamerismCommand();
 std::unique_ptr<Command> MakeSpectrumCommand();
 

@@ -45,6 +45,16 @@ constexpr CommandEntry kCommands[] = {
      "  aldermoor diff reference.xml run1.xml run2.xml --summary --limit 3\n"
      "  aldermoor diff reference.xml print.xml --formula CMC --weights 2,1 --format csv\n",
      &MakeDiffCommand},
+    {"density", "Compute densities, dot area, contrast and trapping",
+     "  aldermoor density chart.xml --standard ANSIT --paper Strip/paper\n"
+     "  aldermoor density chart.xml --paper Strip/paper --solid Strip/C100 --solid Strip/M100\n"
+     "  aldermoor density chart.xml --paper Strip/paper --first Strip/C100 \\\n"
+     "      --second Strip/M100 --overprint Strip/CM\n",
+     &MakeDensityCommand},
+    {"light", "Judge spectra as those of lamps", "  aldermoor light lamps.xml\n",
+     &MakeLightCommand},
+    {"classify", "Name the colour family of every sample", "  aldermoor classify chart.xml\n",
+     &MakeClassifyCommand},
     {"metamerism", "Tell how far pairs of samples drift apart under other lights",
      "  aldermoor metamerism original.xml copy.xml --reference D65 --test A,F11\n",
      &MakeMetamerismCommand},
