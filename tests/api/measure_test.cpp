@@ -118,7 +118,12 @@ TEST(MeasureTest, JudgementsOfSpectra) {
   const auto back = sample.GetSampleAttribute("VEXColorVector", lab, true);
   EXPECT_LT(ColorDifference(color, dynamic_cast<const ColorVector&>(*back)), 0.1F);
   EXPECT_EQ(ReasonOf([] { SpectrumOfColor(Lab(60, 120, -120)); }),
-            "TristimCalculator: Conversion out of Range");
+            "a reflectance spectrum of this colour cannot be computed");
+  const Conditions lab_on_paper = Of({{kLight, "D50"}, {kSpace, "CIELab"}, {kBase, "Paper"}});
+  EXPECT_EQ(ReasonOf([&] {
+              SpectrumOfColor({lab_on_paper, {60.0F, 2.0F, 1.0F}});
+            }),
+            "a reflectance spectrum of this colour" + why);
 }
 
 TEST(MeasureTest, LightsHaveATemperatureAndAnIndex) {

@@ -205,14 +205,11 @@ TEST(DensityTest, WithoutAPaperWhiteWhatIsAbsoluteIsLeft) {
   HXDensity density;
   float value = 0.0F;
   int channel = 1;
-  unsigned short wavelength = 0;
   EXPECT_FALSE(Calculator::GetDensityVector(s, kDin, true, density));
   EXPECT_TRUE(Near(density.ByChannel(1), 1.0, 1e-5));
   EXPECT_FALSE(Calculator::GetDensity(s, kDin, true, value, channel, true));
   EXPECT_EQ(value, 9.99F);
   EXPECT_EQ(channel, -1);
-  EXPECT_FALSE(Calculator::GetMaxDensity(s, true, value, wavelength));
-  EXPECT_EQ(wavelength, 550);
   EXPECT_TRUE(Calculator::GetContrast(s, s, kDin, false, 1, value));
   EXPECT_FALSE(Calculator::GetContrast(s, s, kDin, false, kMax, value)) << "always on paper";
   const Paper black(0.0F);  // not valid

@@ -56,7 +56,9 @@ Spectrum SpectrumOfColor(const ColorVector& color) try {
       [&] {
         return Vexdoc::ToSpectrum(TristimService::GetSpectrum(Vexdoc::ToHXColorVector(color)));
       },
-      [&] { return ReasonOfFailure(*color.GetConditions(), "a spectrum"); });
+      [&] {
+        return ReasonOfFailure(*color.GetConditions(), "a reflectance spectrum of this colour");
+      });
 }
 ALDERMOOR_FRAME(Aldermoor::Measure::SpectrumOfColor)
 

@@ -16,15 +16,16 @@ std::string ReasonOfFailure(const Vexdoc::Conditions& conditions, const std::str
 
 inline constexpr const char* kNoPaperWhite = "there is no paper white";
 
-/// Runs `compute` and turns a failure of colorimetry into a MeasureException.  Its bare name says
-/// nothing, so `reason()` does.
+/// Runs `compute` and turns a failure of colorimetry into a MeasureException.  A text that begins
+/// with its name says nothing of the cause, so `reason()` does.
 template <class Compute, class Reason>
 auto Computed(Compute compute, Reason reason) {
   try {
     return compute();
   } catch (const Tristim::TristimException& e) {
-    constexpr const char* kBareName = "TristimCalculator";
-    MeasureException failure(e.what() == std::string(kBareName) ? reason() : e.what(), "");
+    constexpr const char* kName = "TristimCalculator";
+    const std::string text = e.what();
+    MeasureException failure(text.starts_with(kName) ? reason() : text, "");
     failure.where() = e.where();
     throw failure;
   }
