@@ -10,6 +10,7 @@
 #include "coloroptions.h"
 #include "command.h"
 #include "documents.h"
+#include "illuminant.h"
 #include "output.h"
 #include "records.h"
 #include "samplepairs.h"
@@ -38,7 +39,7 @@ class MetamerismCommand : public Command {
         ->type_name("WORD")
         ->capture_default_str();
     app.add_option("--test", tests_,
-                   "Illuminants under which they may not, with commas between them")
+                   "Named illuminants under which they may not, with commas between them")
         ->type_name("WORD,...")
         ->capture_default_str();
     app.add_option("--observer", observer_, "Observer: " + std::string(*WordsFor(kObserverKey)))
@@ -79,15 +80,15 @@ class MetamerismCommand : public Command {
   void CheckStandardInput() const {
     InputOptions all;
     all.paths = {first_, second_};
-    for (const std::string_view word : SplitAtCommas(tests_)) {
-      all.paths.push_back(IlluminantFile(std::string(word)));
-    }
     all.CheckStandardInput(IlluminantFile(reference_));
   }
 
   std::vector<TestLight> MakeTestLights(const Vexdoc::Conditions& reference) const {
     std::vector<TestLight> lights;
     for (const std::string_view word : SplitAtCommas(tests_)) {
+      if (word.starts_with(kSpectrumMark)) {
+        throw UsageError("--test: a test light needs a name; a spectrum can be the reference only");
+      }
       TestLight& light = lights.emplace_back(TestLight{std::string(word), reference});
       SetReflectionIlluminant(light.conditions, "--test", light.word);
     }

@@ -93,7 +93,7 @@ TEST_F(ToolTest, ColorimetryRefusesWhatMakesNoSenseBeforeAnythingIsWritten) {
            {"diff a.xml a.xml --weights 1,0,1", "2000 takes 3 numbers above 0"},
            {"diff a.xml a.xml --limit nan", "0 or above"},
            {"diff - -", "only once"},
-           {"metamerism a.xml a.xml --test A,,C", "--test: '' is not one of"},
+           {"metamerism a.xml a.xml --test A,@a.xml:S/gray", "needs a name"},
            {"metamerism a.xml a.xml --reference Emission", "is for lights"},
            {"spectrum 1,2", "'1,2' is not of 3 numbers"},
            {"spectrum", "or --input"},
