@@ -10,23 +10,49 @@
 
 namespace Aldermoor::Tool {
 
+namespace {
+
+std::string Words(const std::string& key) {
+  return std::string(*WordsFor(key));
+}
+
+}  // namespace
+
+void SetIlluminant(Vexdoc::Conditions& request, const std::string& option,
+                   const std::string& word) {
+  if (word.starts_with(kSpectrumMark)) {
+    request.SetCustomIllumination(SpectrumPath::Parse(word, option).Load());
+    request.AddAttribute(kIlluminationKey, kUserdefined);
+  } else {
+    request.AddAttribute(kIlluminationKey, ConditionValue(option, kIlluminationKey, word));
+  }
+}
+
+void SetReflectionIlluminant(Vexdoc::Conditions& request, const std::string& option,
+                             const std::string& word) {
+  SetIlluminant(request, option, word);
+  if (word == kEmission) {
+    throw UsageError(
+        fmt::format("{}: '{}' is for lights, and these are reflecting samples", option, word));
+  }
+}
+
+std::string IlluminantFile(const std::string& word) {
+  return word.starts_with(kSpectrumMark) ? SpectrumPath::Parse(word).file : "";
+}
+
+std::string IlluminantHelp() {
+  return Words(kIlluminationKey) +
+         "; a daylight of 4000K to 25000K, such as 6500K; a spectrum of a document as "
+         "@FILE:SET/SAMPLE";
+}
+
 void ColorOptions::AddTo(CLI::App& app) {
-  const auto words = [](const std::string& key) {
-    return std::string(*WordsFor(key));
-  };
-  app.add_option("--space", space, "Colour space: " + words(kTypeKey))
+  app.add_option("--space", space, "Colour space: " + Words(kTypeKey))
       ->type_name("WORD")
       ->capture_default_str();
-  app.add_option("--illuminant", illuminant,
-                 "Illuminant: " + words(kIlluminationKey) +
-                     "; a daylight of 4000K to 25000K, such as 6500K; a spectrum of a document as "
-                     "@FILE:SET/SAMPLE")
-      ->type_name("WORD")
-      ->capture_default_str();
-  app.add_option("--observer", observer, "Observer: " + words(kObserverKey))
-      ->type_name("WORD")
-      ->capture_default_str();
-  app.add_option("--white-base", white_base, "White base: " + words(kWhiteBaseKey))
+  AddViewingTo(app);
+  app.add_option("--white-base", white_base, "White base: " + Words(kWhiteBaseKey))
       ->type_name("WORD");
   app.add_option("--condition", conditions,
                  "Further condition as KEY=VALUE; may be repeated.  A key outside the vocabulary "
@@ -35,8 +61,13 @@ void ColorOptions::AddTo(CLI::App& app) {
       ->allow_extra_args(false);
 }
 
-std::string ColorOptions::GetIlluminantFile() const {
-  return illuminant.starts_with(kSpectrumMark) ? SpectrumPath::Parse(illuminant).file : "";
+void ColorOptions::AddViewingTo(CLI::App& app) {
+  app.add_option("--illuminant", illuminant, "Illuminant: " + IlluminantHelp())
+      ->type_name("WORD")
+      ->capture_default_str();
+  app.add_option("--observer", observer, "Observer: " + Words(kObserverKey))
+      ->type_name("WORD")
+      ->capture_default_str();
 }
 
 Vexdoc::Conditions ColorOptions::MakeConditions() const {
@@ -46,19 +77,9 @@ Vexdoc::Conditions ColorOptions::MakeConditions() const {
   if (white_base) {
     request.AddAttribute(kWhiteBaseKey, ConditionValue("--white-base", kWhiteBaseKey, *white_base));
   }
-  ApplyIlluminant(request);
+  SetIlluminant(request, "--illuminant", illuminant);
   ApplyConditions(request);
   return request;
-}
-
-void ColorOptions::ApplyIlluminant(Vexdoc::Conditions& request) const {
-  if (illuminant.starts_with(kSpectrumMark)) {
-    request.SetCustomIllumination(SpectrumPath::Parse(illuminant).Load());
-    request.AddAttribute(kIlluminationKey, kUserdefined);
-  } else {
-    request.AddAttribute(kIlluminationKey,
-                         ConditionValue("--illuminant", kIlluminationKey, illuminant));
-  }
 }
 
 void ColorOptions::ApplyConditions(Vexdoc::Conditions& request) const {

@@ -13,6 +13,17 @@ class App;
 
 namespace Aldermoor::Tool {
 
+/// Sets the illuminant `word`, a spectrum of a document too, that was given with `option`.
+/// Throws: UsageError for what is not in the vocabulary; InputError if the document cannot be read.
+void SetIlluminant(Vexdoc::Conditions& request, const std::string& option, const std::string& word);
+/// The same for what reflects light, so without "Emission".
+void SetReflectionIlluminant(Vexdoc::Conditions& request, const std::string& option,
+                             const std::string& word);
+/// The file of an illuminant that is a spectrum of a document, else empty.
+std::string IlluminantFile(const std::string& word);
+/// What an option for an illuminant takes, for its help.
+std::string IlluminantHelp();
+
 /// The options that say under what a colour is asked for: "--space", "--illuminant",
 /// "--observer", "--white-base" and "--condition".
 struct ColorOptions {
@@ -23,9 +34,10 @@ struct ColorOptions {
   std::vector<std::string> conditions;
 
   void AddTo(CLI::App& app);
+  /// Only "--illuminant" and "--observer".
+  void AddViewingTo(CLI::App& app);
 
-  /// The file of an illuminant that is a spectrum of a document, else empty.
-  std::string GetIlluminantFile() const;
+  std::string GetIlluminantFile() const { return IlluminantFile(illuminant); }
 
   /// The request.  "--condition" is applied in order and last.
   /// Throws: UsageError for what is not in the vocabulary; InputError if the document of an
@@ -33,7 +45,6 @@ struct ColorOptions {
   Vexdoc::Conditions MakeConditions() const;
 
  private:
-  void ApplyIlluminant(Vexdoc::Conditions& request) const;
   void ApplyConditions(Vexdoc::Conditions& request) const;
 };
 

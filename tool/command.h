@@ -36,6 +36,13 @@ std::unique_ptr<Command> MakeExtractCommand();
 std::unique_ptr<Command> MakeInfoCommand();
 std::unique_ptr<Command> MakeMergeCommand();
 
+std::unique_ptr<Command> MakeClassifyCommand();
+std::unique_ptr<Command> MakeDensityCommand();
+std::unique_ptr<Command> MakeDiffCommand();
+std::unique_ptr<Command> MakeLightCommand();
+std::unique_ptr<Command> MakeMetamerismCommand();
+std::unique_ptr<Command> MakeSpectrumCommand();
+
 }  // namespace Aldermoor::Tool
 
 #endif  // ALDERMOOR_TOOL_COMMAND_H

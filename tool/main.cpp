@@ -40,6 +40,28 @@ constexpr CommandEntry kCommands[] = {
      "  aldermoor color chart.xml --set Ramp --sample \"Cyan 50\" --format json\n"
      "  aldermoor color - --format csv --output chart.csv < chart.xml\n",
      &MakeColorCommand},
+    {"diff", "Compare the samples of documents with those of a reference",
+     "  aldermoor diff reference.xml print.xml\n"
+     "  aldermoor diff reference.xml run1.xml run2.xml --summary --limit 3\n"
+     "  aldermoor diff reference.xml print.xml --formula CMC --weights 2,1 --format csv\n",
+     &MakeDiffCommand},
+    {"density", "Compute densities, dot area, contrast and trapping",
+     "  aldermoor density chart.xml --standard ANSIT --paper Strip/paper\n"
+     "  aldermoor density chart.xml --paper Strip/paper --solid Strip/C100 --solid Strip/M100\n"
+     "  aldermoor density chart.xml --paper Strip/paper --first Strip/C100 \\\n"
+     "      --second Strip/M100 --overprint Strip/CM\n",
+     &MakeDensityCommand},
+    {"light", "Judge spectra as those of lamps", "  aldermoor light lamps.xml\n",
+     &MakeLightCommand},
+    {"classify", "Name the colour family of every sample", "  aldermoor classify chart.xml\n",
+     &MakeClassifyCommand},
+    {"metamerism", "Tell how far pairs of samples drift apart under other lights",
+     "  aldermoor metamerism original.xml copy.xml --reference D65 --test A,F11\n",
+     &MakeMetamerismCommand},
+    {"spectrum", "Find reflectance spectra for given colours",
+     "  aldermoor spectrum 50,20,10 --illuminant D65\n"
+     "  aldermoor spectrum --input colours.xml --save spectra.xml\n",
+     &MakeSpectrumCommand},
     {"convert", "Turn XML into CSV, CSV into XML, or either into its own form anew",
      "  aldermoor convert legacy.xml new.xml --condition Colorimetric.Observer=TwoDegree\n"
      "  aldermoor convert chart.csv chart.xml --percent --set Chart\n"
@@ -67,7 +89,7 @@ constexpr CommandEntry kCommands[] = {
 constexpr const char* kExitStatusText =
     "Exit status:\n"
     "  0  everything was done\n"
-    "  1  some samples failed, no sample matched, or a file has faults\n"
+    "  1  some samples failed or none matched, a limit was exceeded, or a file has faults\n"
     "  2  wrong usage; nothing was computed\n"
     "  3  an input could not be read; the others were processed\n"
     "  4  the output could not be written\n";

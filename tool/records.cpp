@@ -28,11 +28,7 @@ std::string Rounded(float value, int decimals) {
 class CsvWriter : public RecordWriter {
  public:
   CsvWriter(Output& output, const std::vector<Column>& columns) : output_(output) {
-    for (const Column& column : columns) {
-      Separate();
-      AppendCsvField(line_, column.name);
-    }
-    EndLine();
+    WriteNames(columns);
   }
 
   void Add(std::span<const Cell> record) override {
@@ -47,9 +43,22 @@ class CsvWriter : public RecordWriter {
     EndLine();
   }
 
+  void BeginList(const std::string& /*name*/, std::vector<Column> columns) override {
+    EndLine();
+    WriteNames(columns);
+  }
+
   void End() override {}
 
  private:
+  void WriteNames(const std::vector<Column>& columns) {
+    for (const Column& column : columns) {
+      Separate();
+      AppendCsvField(line_, column.name);
+    }
+    EndLine();
+  }
+
   void Separate() {
     if (!first_) {
       line_ += ',';
@@ -73,11 +82,7 @@ class JsonWriter : public RecordWriter {
  public:
   JsonWriter(Output& output, const std::vector<Column>& columns, const Conditions& conditions)
       : output_(output) {
-    for (const Column& column : columns) {
-      std::string& key = keys_.emplace_back(keys_.empty() ? "{" : ", ");
-      AppendJsonString(key, column.name);
-      key += ": ";
-    }
+    SetKeys(columns);
     std::string head = "{\n  \"conditions\": {";
     const char* separator = "\n    ";
     for (const auto& [key, value] : conditions) {
@@ -103,23 +108,39 @@ class JsonWriter : public RecordWriter {
     output_.Write(line_);
   }
 
+  void BeginList(const std::string& name, std::vector<Column> columns) override {
+    keys_.clear();
+    SetKeys(columns);
+    separator_ = kFirst;
+    line_ = "\n  ],\n  ";
+    AppendJsonString(line_, name);
+    output_.Write(line_ + ": [");
+  }
+
   void End() override { output_.Write("\n  ]\n}\n"); }
 
  private:
+  static constexpr const char* kFirst = "\n    ";
+
+  void SetKeys(const std::vector<Column>& columns) {
+    for (const Column& column : columns) {
+      std::string& key = keys_.emplace_back(keys_.empty() ? "{" : ", ");
+      AppendJsonString(key, column.name);
+      key += ": ";
+    }
+  }
+
   Output& output_;
   std::vector<std::string> keys_;  // each with what stands in front of and behind it
-  const char* separator_ = "\n    ";
+  const char* separator_ = kFirst;
   std::string line_;
 };
 
 /// Keeps the records until the end, since every one of them may widen a column.
 class TableWriter : public RecordWriter {
  public:
-  TableWriter(Output& output, std::vector<Column> columns)
-      : output_(output), columns_(std::move(columns)), number_(columns_.size()) {
-    for (const Column& column : columns_) {
-      widths_.push_back(DisplayWidth(column.name));
-    }
+  TableWriter(Output& output, std::vector<Column> columns) : output_(output) {
+    SetColumns(std::move(columns));
   }
 
   void Add(std::span<const Cell> record) override {
@@ -132,6 +153,12 @@ class TableWriter : public RecordWriter {
       }
       widths_[i] = std::max(widths_[i], DisplayWidth(cells_.back()));
     }
+  }
+
+  void BeginList(const std::string& /*name*/, std::vector<Column> columns) override {
+    End();
+    EndLine();
+    SetColumns(std::move(columns));
   }
 
   void End() override {
@@ -149,6 +176,16 @@ class TableWriter : public RecordWriter {
   }
 
  private:
+  void SetColumns(std::vector<Column> columns) {
+    columns_ = std::move(columns);
+    number_.assign(columns_.size(), false);
+    widths_.clear();
+    for (const Column& column : columns_) {
+      widths_.push_back(DisplayWidth(column.name));
+    }
+    cells_.clear();
+  }
+
   void Pad(std::size_t column, const std::string& text) {
     const std::size_t fill = widths_[column] - DisplayWidth(text);
     line_.append(column == 0 ? 0 : 2, ' ');

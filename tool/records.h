@@ -51,6 +51,9 @@ class RecordWriter {
 
   /// One cell for each column.
   virtual void Add(std::span<const Cell> record) = 0;
+  /// Ends the records so far and begins others.  In json they stand under `name`, in the other
+  /// formats behind an empty line.
+  virtual void BeginList(const std::string& name, std::vector<Column> columns) = 0;
   virtual void End() = 0;
 };
 

@@ -1,8 +1,10 @@
 #include "text.h"
 
 #include <algorithm>
+#include <charconv>
 #include <cmath>
 #include <iterator>
+#include <system_error>
 
 #include <fmt/format.h>
 #include <nlohmann/json.hpp>
@@ -131,6 +133,32 @@ void AppendJsonNumber(std::string& out, float value) {
   } else {
     out += "null";
   }
+}
+
+std::vector<std::string_view> SplitAtCommas(std::string_view list) {
+  std::vector<std::string_view> parts;
+  while (true) {
+    const std::size_t length = std::min(list.find(','), list.size());
+    parts.push_back(list.substr(0, length));
+    if (length == list.size()) {
+      return parts;
+    }
+    list.remove_prefix(length + 1);
+  }
+}
+
+std::optional<std::vector<float>> ParseNumbers(std::string_view list) {
+  std::vector<float> numbers;
+  for (const std::string_view part : SplitAtCommas(list)) {
+    float number = 0.0F;
+    const char* const end = part.data() + part.size();
+    const auto [parsed, error] = std::from_chars(part.data(), end, number);
+    if (parsed != end || error != std::errc() || !std::isfinite(number)) {
+      return std::nullopt;
+    }
+    numbers.push_back(number);
+  }
+  return numbers;
 }
 
 }  // namespace Aldermoor::Tool

@@ -2,8 +2,10 @@
 #define ALDERMOOR_TOOL_TEXT_H
 
 #include <cstddef>
+#include <optional>
 #include <string>
 #include <string_view>
+#include <vector>
 
 /// How texts and numbers are shown; texts are UTF-8.
 namespace Aldermoor::Tool {
@@ -26,6 +28,11 @@ void AppendCsvField(std::string& out, std::string_view text);
 void AppendJsonString(std::string& out, std::string_view text);
 /// As AppendNumber; what is no number is null.
 void AppendJsonNumber(std::string& out, float value);
+
+/// The parts of `list` between commas; one empty part for an empty list.
+std::vector<std::string_view> SplitAtCommas(std::string_view list);
+/// Finite numbers between commas, or nothing if there is anything else.
+std::optional<std::vector<float>> ParseNumbers(std::string_view list);
 
 }  // namespace Aldermoor::Tool
 

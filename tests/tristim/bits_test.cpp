@@ -1,9 +1,11 @@
+#include <algorithm>
 #include <bit>
 #include <cmath>
 #include <cstdint>
 
 #include <gtest/gtest.h>
 
+#include "aldermoor/tristim/internals/densitycalculator.h"
 #include "aldermoor/tristim/internals/tristimcalculator.h"
 #include "aldermoor/tristim/tristimservice.h"
 
@@ -33,8 +35,10 @@ class Lcg {
 /// FNV-1a, 64 bit, over the bit patterns of floats, lowest byte first.
 class Checksum {
  public:
-  void Add(const HXColorVector& vector) {
-    for (const float value : vector.GetChannels()) {
+  void Add(const HXColorVector& vector) { Add(vector.GetChannels()); }
+  template <std::size_t N>
+  void Add(const std::array<float, N>& values) {
+    for (const float value : values) {
       // The sign of a NaN is the compiler's choice, so none may come up.
       ASSERT_FALSE(std::isnan(value));
       const auto bits = std::bit_cast<std::uint32_t>(value);
@@ -120,6 +124,59 @@ TEST(BitsTest, OfAllConversionsOfVectors) {
     }
   }
   EXPECT_EQ(checksum.Get(), 0xFEFDD023194A4D2BULL);
+}
+
+HXSpectrum Smooth(Lcg& random, const HXMeasureConditions& conditions) {
+  HXSpectrum spectrum = Flat(0.0F, conditions);
+  float value = random.Next(0.1F, 0.9F);
+  for (unsigned i = 0; i < HXSpectrum::kBands; ++i) {
+    value = std::clamp(value + random.Next(-0.1F, 0.1F), 0.05F, 0.95F);
+    spectrum[i] = value;
+  }
+  return spectrum;
+}
+
+TEST(BitsTest, OfDifferencesAndReconstructedSpectra) {
+  Lcg random;
+  Checksum checksum;
+  const std::vector<HXMeasureConditions> lights = AllLights(random);
+  for (HXMeasureConditions light : lights) {
+    if (light.GetIllumination().GetIlluminationType() == IlluminationType::kEmission) {
+      continue;
+    }
+    for (int round = 0; round < 20; ++round) {
+      const HXSpectrum first = Smooth(random, light);
+      const HXSpectrum second = Smooth(random, light);
+      for (const char* const formula :
+           {"CIELab", "LABhx", "CIELuv", "FMCII", "CMC", "94", "2000"}) {
+        light.SetMeasureCondition(Vocabulary::kDeltaEFormulaKey, formula);
+        checksum.Add(std::array{TristimService::GetDeltaE(first, second, light, 0.0F, 1.5F, 2.0F)});
+      }
+      checksum.Add(std::array{TristimService::GetMetamery(first, second, light, lights[0])});
+      checksum.Add(TristimService::GetSpectrum(TristimService::GetVector(first, light)).GetBands());
+    }
+  }
+  EXPECT_EQ(checksum.Get(), 0xE8E0081AF5457DD6ULL);
+}
+
+TEST(BitsTest, OfLightsAndDensities) {
+  Lcg random;
+  Checksum checksum;
+  for (int round = 0; round < 200; ++round) {
+    const HXSpectrum spectrum =
+        Smooth(random, Conditions("Emission", round % 2 == 0 ? "TwoDegree" : "TenDegree"));
+    float index = 0.0F;
+    std::string reference;
+    (void)TristimService::GetColorRenderingIndex(spectrum, index, reference);
+    checksum.Add(std::array{index, TristimService::GetColorTemperature(spectrum)});
+    Internals::HXDensity density;
+    ASSERT_TRUE(
+        Internals::DensityCalculator::GetDensityVector(spectrum, round % 7, false, density));
+    checksum.Add(density.GetAll());
+    checksum.Add(std::array{
+        Internals::DotArea(density.ByChannel(1), density.ByChannel(2), random.Next(1.0F, 3.0F))});
+  }
+  EXPECT_EQ(checksum.Get(), 0x9FB92FD9FD114C0ULL);
 }
 
 }  // namespace

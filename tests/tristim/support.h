@@ -35,8 +35,12 @@ inline HXSpectrum Flat(float value, const HXMeasureConditions& conditions = {}) 
   return HXSpectrum(bands.data(), conditions);
 }
 
+inline double Widen(float value) {
+  return static_cast<double>(value);
+}
+
 inline ::testing::AssertionResult Near(float actual, double expected, double tolerance) {
-  return Aldermoor::Tests::Within(static_cast<double>(actual), expected, tolerance);
+  return Aldermoor::Tests::Within(Widen(actual), expected, tolerance);
 }
 
 /// Of the first three channels.

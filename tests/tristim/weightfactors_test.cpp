@@ -10,6 +10,7 @@
 #include "aldermoor/tristim/internals/tristimfilter.h"
 #include "aldermoor/tristim/tristimexception.h"
 
+#include "tests/tristim/published.h"
 #include "tests/tristim/support.h"
 
 namespace Aldermoor::Tristim::Tests {
@@ -22,30 +23,11 @@ double Sum(const float* values, std::size_t count = 36) {
   return std::accumulate(values, values + count, 0.0);
 }
 
-struct WhiteCase {
-  const char* illumination;
-  const char* observer;
-  double x, z;
-};
-
 // What the CIE tables at 1 nm give, to three decimals.
 constexpr WhiteCase kWhites[] = {
     {"D50", "TwoDegree", 96.422, 82.522},  {"D65", "TwoDegree", 95.047, 108.883},
     {"D65", "TenDegree", 94.811, 107.305}, {"A", "TwoDegree", 109.849, 35.585},
     {"C", "TwoDegree", 98.073, 118.232},   {"F11", "TwoDegree", 100.963, 64.353}};
-
-// As commonly cited from ASTM E308-01, table 5, weights for 10 nm; not yet compared with a copy of
-// the standard.
-constexpr WhiteCase kPublishedWhites[] = {
-    {"A", "TwoDegree", 109.850, 35.585},   {"C", "TwoDegree", 98.074, 118.232},
-    {"D50", "TwoDegree", 96.422, 82.521},  {"D55", "TwoDegree", 95.682, 92.149},
-    {"D65", "TwoDegree", 95.047, 108.883}, {"D75", "TwoDegree", 94.972, 122.638},
-    {"F2", "TwoDegree", 99.186, 67.393},   {"F7", "TwoDegree", 95.041, 108.747},
-    {"F11", "TwoDegree", 100.962, 64.350}, {"A", "TenDegree", 111.144, 35.200},
-    {"C", "TenDegree", 97.285, 116.145},   {"D50", "TenDegree", 96.720, 81.427},
-    {"D55", "TenDegree", 95.799, 90.926},  {"D65", "TenDegree", 94.811, 107.304},
-    {"D75", "TenDegree", 94.416, 120.641}, {"F2", "TenDegree", 103.279, 69.027},
-    {"F7", "TenDegree", 95.792, 107.686},  {"F11", "TenDegree", 103.863, 65.607}};
 
 void ExpectWhite(const WhiteCase& c, double tolerance) {
   SCOPED_TRACE(::testing::Message() << c.illumination << ", " << c.observer);
@@ -65,22 +47,6 @@ TEST(WeightfactorsTest, SumsAreThePublishedWhitePoints) {
     ExpectWhite(c, kPublishedWhitePoint);
   }
 }
-
-struct ChromaticityCase {
-  const char* illumination;
-  double x, y;
-};
-
-// Source: CIE 15:2004 (A, C, D50 to D75, FL1 to FL12; two-degree); B from the
-// recommendation of 1931.
-constexpr ChromaticityCase kChromaticities[] = {
-    {"A", 0.44758, 0.40745},   {"B", 0.34842, 0.35161},   {"C", 0.31006, 0.31616},
-    {"D50", 0.34567, 0.35851}, {"D55", 0.33243, 0.34744}, {"D65", 0.31272, 0.32903},
-    {"D75", 0.29903, 0.31488}, {"F1", 0.3131, 0.3371},    {"F2", 0.3721, 0.3751},
-    {"F3", 0.4091, 0.3941},    {"F4", 0.4402, 0.4031},    {"F5", 0.3138, 0.3452},
-    {"F6", 0.3779, 0.3882},    {"F7", 0.3129, 0.3292},    {"F8", 0.3458, 0.3586},
-    {"F9", 0.3741, 0.3727},    {"F10", 0.3458, 0.3588},   {"F11", 0.3805, 0.3769},
-    {"F12", 0.4370, 0.4042}};
 
 TEST(WeightfactorsTest, WhitePointsHaveThePublishedChromaticity) {
   for (const ChromaticityCase& c : kChromaticities) {

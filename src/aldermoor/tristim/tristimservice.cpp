@@ -1,5 +1,11 @@
 #include "aldermoor/tristim/tristimservice.h"
 
+#include <array>
+
+#include "aldermoor/tristim/internals/colorrenderingcalculator.h"
+#include "aldermoor/tristim/internals/colortemperature.h"
+#include "aldermoor/tristim/internals/deltaemath.h"
+#include "aldermoor/tristim/internals/lab2spec.h"
 #include "aldermoor/tristim/internals/tristimcalculator.h"
 #include "aldermoor/tristim/internals/vocabulary.h"
 #include "aldermoor/tristim/tristimexception.h"
@@ -15,6 +21,8 @@ constexpr char kCalculatorFailed[] = "TristimCalculator";
 constexpr char kNoColorSpace[] = "GetVector not supported for ColorSpace ";
 constexpr char kNoConversionFrom[] = "Conversion not supported from ColorSpace ";
 constexpr char kNoConversionTo[] = " to ColorSpace ";
+constexpr char kNoFormula[] = "GetDeltaE not supported for DeltaEFormula ";
+constexpr char kOutOfRange[] = "TristimCalculator: Conversion out of Range";
 constexpr char kRgbFailed[] = "Conversion failed from RGB to XYZ";
 
 using FromSpectrum = bool (*)(const HXSpectrum& spectrum, const HXMeasureConditions& conditions,
@@ -112,6 +120,87 @@ constexpr DeltaRow kDeltaRows[] = {
     {Words::kLABhx, Calculator::GetVector_LCHhx_delta, Words::kLCHhx},
 };
 
+constexpr float kUsual = 1.0F;
+constexpr float kUsualL = 2.0F;  // of CMC
+
+using Weights = std::array<float, 3>;
+using DeltaOfSpectra = float (*)(const HXSpectrum& first, const HXSpectrum& second,
+                                 const HXMeasureConditions& conditions, const Weights& weights);
+using DeltaOfLab = float (*)(const Internals::HXLab& first, const Internals::HXLab& second,
+                             const Weights& weights);
+
+using UnweightedDelta = float (*)(const HXSpectrum& first, const HXSpectrum& second,
+                                  const HXMeasureConditions& conditions);
+
+template <UnweightedDelta kDelta>
+float Unweighted(const HXSpectrum& first, const HXSpectrum& second,
+                 const HXMeasureConditions& conditions, const Weights& /*weights*/) {
+  return kDelta(first, second, conditions);
+}
+
+/// A formula word with its two forms; without the second it is for spectra only.
+struct FormulaRow {
+  std::string_view formula;
+  Weights usual;
+  DeltaOfSpectra of_spectra;
+  DeltaOfLab of_lab;
+};
+
+constexpr FormulaRow kFormulaRows[] = {
+    {Words::kCIELab,
+     {},
+     Unweighted<Calculator::GetDeltaE_CIELAB>,
+     [](const Internals::HXLab& first, const Internals::HXLab& second, const Weights&) {
+       return Calculator::GetDeltaE_CIELAB(first, second);
+     }},
+    {Words::kLABhx, {}, Unweighted<Calculator::GetDeltaE_hx>, nullptr},
+    {Words::kCIELuv, {}, Unweighted<Calculator::GetDeltaE_CIELUV>, nullptr},
+    {Words::kFMCII, {}, Unweighted<Calculator::GetDeltaE_FMCII>, nullptr},
+    {Words::kCMC,
+     {kUsualL, kUsual, kUsual},
+     [](const HXSpectrum& first, const HXSpectrum& second, const HXMeasureConditions& conditions,
+        const Weights& w) {
+       return Calculator::GetDeltaE_CMC(first, second, conditions, w[0], w[1]);
+     },
+     [](const Internals::HXLab& first, const Internals::HXLab& second, const Weights& w) {
+       return Calculator::GetDeltaE_CMC(first, second, w[0], w[1]);
+     }},
+    {Words::k94,
+     {kUsual, kUsual, kUsual},
+     [](const HXSpectrum& first, const HXSpectrum& second, const HXMeasureConditions& conditions,
+        const Weights& w) {
+       return Calculator::GetDeltaE_94(first, second, conditions, w[0], w[1], w[2]);
+     },
+     [](const Internals::HXLab& first, const Internals::HXLab& second, const Weights& w) {
+       return Calculator::GetDeltaE_94(first, second, w[0], w[1], w[2]);
+     }},
+    {Words::k2000,
+     {kUsual, kUsual, kUsual},
+     [](const HXSpectrum& first, const HXSpectrum& second, const HXMeasureConditions& conditions,
+        const Weights& w) {
+       return Calculator::GetDeltaE_2000(first, second, conditions, w[0], w[1], w[2]);
+     },
+     [](const Internals::HXLab& first, const Internals::HXLab& second, const Weights& w) {
+       return Calculator::GetDeltaE_2000(first, second, w[0], w[1], w[2]);
+     }},
+};
+
+const FormulaRow* FindFormula(std::string_view formula) {
+  for (const FormulaRow& row : kFormulaRows) {
+    if (row.formula == formula) {
+      return &row;
+    }
+  }
+  return nullptr;
+}
+
+Weights WithUsual(Weights weights, const Weights& usual) {
+  for (std::size_t i = 0; i < weights.size(); ++i) {
+    weights[i] = weights[i] == 0.0F ? usual[i] : weights[i];
+  }
+  return weights;
+}
+
 FromSpectrum FindWay(std::string_view color_space) {
   for (const SpectrumRow& row : kSpectrumRows) {
     if (row.color_space == color_space) {
@@ -192,6 +281,87 @@ HXColorVector TristimService::GetDeltaVector(const HXColorVector& first,
                          ALDERMOOR_HERE(Aldermoor::Tristim::TristimService::GetDeltaVector));
 }
 ALDERMOOR_FRAME(Aldermoor::Tristim::TristimService::GetDeltaVector)
+
+float TristimService::GetDeltaE(const HXSpectrum& first, const HXSpectrum& second,
+                                const HXMeasureConditions& conditions, float weight1, float weight2,
+                                float weight3) try {
+  const FormulaRow* const row = FindFormula(conditions.GetDeltaEFormula());
+  if (row == nullptr) {
+    throw TristimException(kNoFormula + conditions.GetDeltaEFormula(),
+                           ALDERMOOR_HERE(Aldermoor::Tristim::TristimService::GetDeltaE));
+  }
+  const Weights weights = WithUsual({weight1, weight2, weight3}, row->usual);
+  const float difference = row->of_spectra(first, second, conditions, weights);
+  if (difference == Internals::kNoDeltaE) {
+    throw TristimException(kCalculatorFailed,
+                           ALDERMOOR_HERE(Aldermoor::Tristim::TristimService::GetDeltaE));
+  }
+  return difference;
+}
+ALDERMOOR_FRAME(Aldermoor::Tristim::TristimService::GetDeltaE)
+
+float TristimService::GetDeltaE(const HXColorVector& first, const HXColorVector& second,
+                                float weight1, float weight2, float weight3) try {
+  const HXColorVector one = GetVector(first, Words::kCIELab);
+  const HXColorVector other = GetVector(second, Words::kCIELab);
+  const FormulaRow* const row = FindFormula(first.GetMeasureConditions().GetDeltaEFormula());
+  float difference = Internals::kNoDeltaE;
+  if (row != nullptr && row->of_lab != nullptr) {
+    difference = row->of_lab(one, other, WithUsual({weight1, weight2, weight3}, row->usual));
+  }
+  if (difference == Internals::kNoDeltaE) {
+    throw TristimException(kCalculatorFailed,
+                           ALDERMOOR_HERE(Aldermoor::Tristim::TristimService::GetDeltaE));
+  }
+  return difference;
+}
+ALDERMOOR_FRAME(Aldermoor::Tristim::TristimService::GetDeltaE)
+
+std::string TristimService::GetColorType(const HXSpectrum& spectrum) try {
+  return Internals::ColorFamilyName(Calculator::GetColorType(spectrum));
+}
+ALDERMOOR_FRAME(Aldermoor::Tristim::TristimService::GetColorType)
+
+float TristimService::GetMetamery(const HXSpectrum& first, const HXSpectrum& second,
+                                  const HXMeasureConditions& conditions,
+                                  const HXMeasureConditions& testConditions) try {
+  const float index =
+      Calculator::GetMetamery(first, second, conditions, testConditions.GetIllumination());
+  if (index == Internals::kNoDeltaE) {
+    throw TristimException(kCalculatorFailed,
+                           ALDERMOOR_HERE(Aldermoor::Tristim::TristimService::GetMetamery));
+  }
+  return index;
+}
+ALDERMOOR_FRAME(Aldermoor::Tristim::TristimService::GetMetamery)
+
+float TristimService::GetColorTemperature(const HXSpectrum& spectrum) try {
+  return Internals::ColorTemperature().GetColorTemperature(spectrum);
+}
+ALDERMOOR_FRAME(Aldermoor::Tristim::TristimService::GetColorTemperature)
+
+HXSpectrum TristimService::GetSpectrum(const HXColorVector& vector) try {
+  constexpr double kMostDeltaE = 0.1;
+  constexpr int kMostIterations = 1000;
+  static const Internals::Lab2Spec lab_to_spectrum;
+  const HXColorVector lab = GetVector(vector, Words::kCIELab);
+  HXSpectrum spectrum;
+  if (!lab_to_spectrum.GetSpectrum(lab, spectrum, kMostDeltaE, false, kMostIterations)) {
+    throw TristimException(kOutOfRange,
+                           ALDERMOOR_HERE(Aldermoor::Tristim::TristimService::GetSpectrum));
+  }
+  return spectrum;
+}
+ALDERMOOR_FRAME(Aldermoor::Tristim::TristimService::GetSpectrum)
+
+bool TristimService::GetColorRenderingIndex(const HXSpectrum& source, float& index,
+                                            std::string& reference) try {
+  bool valid = false;
+  index = static_cast<float>(
+      Internals::ColorRenderingCalculator().GetColorRenderingIndex(source, valid, reference));
+  return valid;
+}
+ALDERMOOR_FRAME(Aldermoor::Tristim::TristimService::GetColorRenderingIndex)
 
 const std::vector<std::string>& TristimService::GetSupportedValues(std::string_view key) try {
   return HXMeasureConditions::GetSupportedValues(key);

@@ -34,6 +34,40 @@ class TristimService {
   /// Throws: TristimException for any other colour space.
   static HXColorVector GetDeltaVector(const HXColorVector& first, const HXColorVector& second);
 
+  /// Colour difference by the formula that `conditions` name.  A weight of 0 stands for the usual
+  /// one: l = 2 and c = 1 for "CMC", 1 for each of "94" and "2000"; the others have none.  Where a
+  /// formula is not symmetric, `first` is the reference.
+  /// Throws: TristimException for an unknown formula, or if there is no result.
+  static float GetDeltaE(const HXSpectrum& first, const HXSpectrum& second,
+                         const HXMeasureConditions& conditions, float weight1, float weight2,
+                         float weight3);
+  /// The same for two colours that can be taken to CIELab, by the formula of the first; of the
+  /// formulas only "CIELab", "CMC", "94" and "2000".
+  static float GetDeltaE(const HXColorVector& first, const HXColorVector& second, float weight1,
+                         float weight2, float weight3);
+
+  /// The colour family under the conditions of the spectrum, such as "Olive"; "Undefined" for
+  /// violets, which have no word, and without a result.
+  static std::string GetColorType(const HXSpectrum& spectrum);
+
+  /// CIELab difference under the illumination of `testConditions` of two samples that are made to
+  /// match under `conditions`.  Throws: TristimException if there is no result.
+  static float GetMetamery(const HXSpectrum& first, const HXSpectrum& second,
+                           const HXMeasureConditions& conditions,
+                           const HXMeasureConditions& testConditions);
+
+  /// Correlated colour temperature of a light in whole kelvin; -1 if there is none.
+  static float GetColorTemperature(const HXSpectrum& spectrum);
+
+  /// A reflectance spectrum for a colour that can be taken to CIELab, to a difference below 0.1.
+  /// Throws: TristimException if none is found.
+  static HXSpectrum GetSpectrum(const HXColorVector& vector);
+
+  /// General colour rendering index of a light, and the name of the reference daylight, empty for a
+  /// black body.  Returns whether the index means anything.
+  static bool GetColorRenderingIndex(const HXSpectrum& source, float& index,
+                                     std::string& reference);
+
   /// As HXMeasureConditions::GetSupportedValues.
   static const std::vector<std::string>& GetSupportedValues(std::string_view key);
 };

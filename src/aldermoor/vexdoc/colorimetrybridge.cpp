@@ -116,6 +116,15 @@ Spectrum ToSpectrum(const HXSpectrum& spectrum) try {
 }
 ALDERMOOR_FRAME(Aldermoor::Vexdoc::ToSpectrum)
 
+HXColorVector ToHXColorVector(const ColorVector& vector) try {
+  std::vector<float> values;
+  for (const auto& channel : vector.GetDatastore()) {
+    values.push_back(channel.second);
+  }
+  return HXColorVector(values, ToMeasureConditions(*vector.GetConditions()));
+}
+ALDERMOOR_FRAME(Aldermoor::Vexdoc::ToHXColorVector)
+
 SmartPointer<ColorVector> ToColorVector(const HXColorVector& vector) try {
   const HXMeasureConditions& conditions = vector.GetMeasureConditions();
   const std::string color_space = conditions.GetMeasureCondition(kColorSpaceKey);

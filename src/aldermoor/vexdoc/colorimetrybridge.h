@@ -40,6 +40,10 @@ Tristim::HXSpectrum ToHXSpectrum(const Spectrum& spectrum);
 
 Spectrum ToSpectrum(const Tristim::HXSpectrum& spectrum);
 
+/// The first four channels of `vector` by position.
+/// Throws: NullPointerException for one without conditions or channels.
+Tristim::HXColorVector ToHXColorVector(const ColorVector& vector);
+
 /// Throws: std::invalid_argument if the vector's conditions name no colour space.
 Utilities::Tools::SmartPointer<ColorVector> ToColorVector(const Tristim::HXColorVector& vector);
 

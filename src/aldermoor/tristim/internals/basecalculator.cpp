@@ -15,16 +15,21 @@ PaperWhite& CurrentPaperWhite() {
   return paper_white.Get();
 }
 
-bool GetPaperSpectrum(const HXMeasureConditions& conditions, HXSpectrum& paper) {
+}  // namespace
+
+bool BaseCalculator::GetPaperSpectrum(const HXMeasureConditions& conditions,
+                                      HXSpectrum& paper) try {
   return CurrentPaperWhite() && CurrentPaperWhite()->GetSpectrum(conditions, paper);
 }
-
-}  // namespace
+ALDERMOOR_FRAME(Aldermoor::Tristim::Internals::BaseCalculator::GetPaperSpectrum)
 
 void BaseCalculator::SetPaperWhitePointer(PaperWhite sample) try {
   CurrentPaperWhite() = std::move(sample);
 }
 ALDERMOOR_FRAME(Aldermoor::Tristim::Internals::BaseCalculator::SetPaperWhitePointer)
+
+PaperWhite BaseCalculator::GetPaperWhitePointer() try { return CurrentPaperWhite(); }
+ALDERMOOR_FRAME(Aldermoor::Tristim::Internals::BaseCalculator::GetPaperWhitePointer)
 
 HXSample& BaseCalculator::GetPaperWhite() try { return *CurrentPaperWhite(); }
 ALDERMOOR_FRAME(Aldermoor::Tristim::Internals::BaseCalculator::GetPaperWhite)

@@ -13,11 +13,17 @@ namespace Aldermoor::Tristim::Internals {
 class BaseCalculator {
  public:
   static void SetPaperWhitePointer(Utilities::Tools::SmartPointer<HXSample> sample);
+  /// Empty if there is none.
+  static Utilities::Tools::SmartPointer<HXSample> GetPaperWhitePointer();
   /// Throws: NullPointerException without a paper white.
   static HXSample& GetPaperWhite();
 
   /// Whether there is a paper white with any value above 0.
   [[nodiscard]] static bool IsPaperWhiteValid(const HXMeasureConditions& conditions);
+
+  /// The spectrum of the paper white; false if there is none.
+  [[nodiscard]] static bool GetPaperSpectrum(const HXMeasureConditions& conditions,
+                                             HXSpectrum& paper);
 
   /// Divides by the paper white band by band.  A band in which that is 0 becomes an infinity or
   /// a NaN.

@@ -2,6 +2,7 @@
 
 #include <algorithm>
 
+#include "aldermoor/tristim/internals/densitycalculator.h"
 #include "aldermoor/tristim/internals/vocabulary.h"
 #include "aldermoor/utilities/exceptions/frame.h"
 
@@ -90,6 +91,7 @@ Initialisator::Initialisator() try {
   for (const Entry& labels : kLabels) {
     AddType(Words::kChannelLabelsPrefix + std::string(labels.key), labels.words);
   }
+  DensityCalculator::InitializeDensityCalibration();
 }
 ALDERMOOR_FRAME(Aldermoor::Tristim::Internals::Initialisator::Initialisator)
 

@@ -4,6 +4,7 @@
 #include "aldermoor/tristim/hxcolorvector.h"
 #include "aldermoor/tristim/hxspectrum.h"
 #include "aldermoor/tristim/internals/basecalculator.h"
+#include "aldermoor/tristim/internals/hxlab.h"
 
 namespace Aldermoor::Tristim::Internals {
 
@@ -77,6 +78,49 @@ class TristimCalculator : public BaseCalculator {
                                                 const HXColorVector& second, HXColorVector& out);
   [[nodiscard]] static bool GetVector_LCHhx_delta(const HXColorVector& first,
                                                   const HXColorVector& second, HXColorVector& out);
+
+  /// Colour differences of two spectra under `conditions`.  kNoDeltaE if a colour or the difference
+  /// cannot be computed; else as the functions of deltaemath.h have it.
+  [[nodiscard]] static float GetDeltaE_CIELAB(const HXSpectrum& first, const HXSpectrum& second,
+                                              const HXMeasureConditions& conditions);
+  /// Distance in L*, u', v': the lightness decides nearly alone.
+  [[nodiscard]] static float GetDeltaE_CIELUV(const HXSpectrum& first, const HXSpectrum& second,
+                                              const HXMeasureConditions& conditions);
+  [[nodiscard]] static float GetDeltaE_hx(const HXSpectrum& first, const HXSpectrum& second,
+                                          const HXMeasureConditions& conditions);
+  [[nodiscard]] static float GetDeltaE_FMCII(const HXSpectrum& first, const HXSpectrum& second,
+                                             const HXMeasureConditions& conditions);
+  [[nodiscard]] static float GetDeltaE_CMC(const HXSpectrum& first, const HXSpectrum& second,
+                                           const HXMeasureConditions& conditions, float l, float c);
+  [[nodiscard]] static float GetDeltaE_94(const HXSpectrum& first, const HXSpectrum& second,
+                                          const HXMeasureConditions& conditions, float kL, float kC,
+                                          float kH);
+  [[nodiscard]] static float GetDeltaE_2000(const HXSpectrum& first, const HXSpectrum& second,
+                                            const HXMeasureConditions& conditions, float kL,
+                                            float kC, float kH);
+
+  [[nodiscard]] static float GetDeltaE_CIELAB(const HXLab& first, const HXLab& second);
+  [[nodiscard]] static float GetDeltaE_CMC(const HXLab& first, const HXLab& second, float l,
+                                           float c);
+  [[nodiscard]] static float GetDeltaE_94(const HXLab& first, const HXLab& second, float kL,
+                                          float kC, float kH);
+  [[nodiscard]] static float GetDeltaE_2000(const HXLab& first, const HXLab& second, float kL,
+                                            float kC, float kH);
+
+  /// For the inner loop of a search: CIELab difference of `lab` and 36 bare values.  The caller has
+  /// set TristimFilter for the conditions of `lab`.  L* is not kept at 0 here.
+  [[nodiscard]] static float GetDeltaE_CIELAB_SpeedOptimized(const HXLab& lab,
+                                                             const float* spectrum);
+
+  /// Number of the colour family, 0 to 15, under the conditions of the spectrum; -1 if its colour
+  /// cannot be computed.
+  [[nodiscard]] static int GetColorType(const HXSpectrum& spectrum);
+  /// How far two samples drift apart under `illumination` that match under `conditions`, as CIELab
+  /// difference; what there is under `conditions` already is divided out of XYZ.  kNoDeltaE on
+  /// failure.  Source: CIE 15:2004, 9.2.2.3, multiplicative correction.
+  [[nodiscard]] static float GetMetamery(const HXSpectrum& first, const HXSpectrum& second,
+                                         const HXMeasureConditions& conditions,
+                                         const HXIllumination& illumination);
 
   /// The white point of `conditions`: Xn, 100, Zn.
   [[nodiscard]] static bool GetNormValence(const HXMeasureConditions& conditions,

@@ -1,0 +1,36 @@
+#ifndef ALDERMOOR_MEASURE_SUPPORT_H
+#define ALDERMOOR_MEASURE_SUPPORT_H
+
+#include <string>
+
+#include "aldermoor/measure/measureexception.h"
+#include "aldermoor/tristim/tristimexception.h"
+#include "aldermoor/utilities/exceptions/frame.h"
+#include "aldermoor/vexdoc/conditions.h"
+
+/// What the functions of this folder share; not installed.
+namespace Aldermoor::Measure {
+
+/// Why a colour under `conditions` cannot be computed.
+std::string ReasonOfFailure(const Vexdoc::Conditions& conditions, const std::string& what);
+
+inline constexpr const char* kNoPaperWhite = "there is no paper white";
+
+/// Runs `compute` and turns a failure of colorimetry into a MeasureException.  A text that begins
+/// with its name says nothing of the cause, so `reason()` does.
+template <class Compute, class Reason>
+auto Computed(Compute compute, Reason reason) {
+  try {
+    return compute();
+  } catch (const Tristim::TristimException& e) {
+    constexpr const char* kName = "TristimCalculator";
+    const std::string text = e.what();
+    MeasureException failure(text.starts_with(kName) ? reason() : text, "");
+    failure.where() = e.where();
+    throw failure;
+  }
+}
+
+}  // namespace Aldermoor::Measure
+
+#endif  // ALDERMOOR_MEASURE_SUPPORT_H
