@@ -1,5 +1,5 @@
-// Times and memory of loading and saving documents, and times of asking samples for colours, in one
-// run.
+// Times and memory of loading and saving documents, times of the colour engine and of asking
+// samples for colours, in one run.
 //
 // Options: "--tsv" for lines to be read by programs, and those of Google Benchmark.
 
@@ -12,6 +12,7 @@
 #include "aldermoor/vexdoc/xmlplatform.h"
 
 #include "benchmarks/attributebenchmark.h"
+#include "benchmarks/enginebenchmark.h"
 #include "benchmarks/loadbenchmark.h"
 #include "benchmarks/peakmemory.h"
 #include "benchmarks/storebenchmark.h"
@@ -46,11 +47,13 @@ int Run(int argc, char** argv) {
   const LoadBenchmark load(workspace);
   const StoreBenchmark store(workspace);
   RegisterAttributeBenchmarks();
+  RegisterEngineBenchmarks();
   std::cerr << "times, all benchmarks interleaved ..." << std::endl;
   Timings timings;
   benchmark::RunSpecifiedBenchmarks(&timings);
   Figures figures = load.Results(timings);
-  for (const Figures& more : {store.Results(timings), AttributeResults(timings)}) {
+  for (const Figures& more :
+       {store.Results(timings), AttributeResults(timings), EngineResults(timings)}) {
     figures.insert(figures.end(), more.begin(), more.end());
   }
   if (tsv) {
