@@ -1,5 +1,5 @@
-// Times and memory of loading and saving documents, times of the colour engine and of asking samples
-// for colours, in one run.
+// Times and memory of loading and saving documents, times of the colour engine and of asking
+// samples for colours, in one run.
 //
 // Options: "--tsv" for lines to be read by programs, and those of Google Benchmark.
 

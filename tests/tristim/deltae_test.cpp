@@ -36,6 +36,21 @@ TEST(DeltaETest, Ciede2000OfThePublishedPairsBothWaysRound) {
   }
 }
 
+// As given with the formulas of the Python package colour-science, for graphic arts and CMC(2:1).
+TEST(DeltaETest, Cie94AndCmcOfPairsThatAnotherLibraryPublishes) {
+  constexpr Quadruple kReference = {100.0F, 21.57210357F, 272.22819350F, 0.0F};
+  constexpr struct {
+    Quadruple sample;
+    double cie94;
+    double cmc;
+  } kPairs[] = {{{100.0F, 426.67945353F, 72.39590835F, 0.0F}, 83.779225501, 172.704771287},
+                {{100.0F, 74.05216981F, 276.45318193F, 0.0F}, 10.053931954, 20.597329912}};
+  for (const auto& [sample, cie94, cmc] : kPairs) {
+    EXPECT_TRUE(Near(DeltaE94(kReference, sample, {1.0F, 1.0F, 1.0F}), cie94, 1e-4));
+    EXPECT_TRUE(Near(DeltaECmc(kReference, sample, 2.0F, 1.0F), cmc, 1e-4));
+  }
+}
+
 // The other formulas once more, from their publications and in extended precision.
 using Real = long double;
 
