@@ -57,7 +57,8 @@ FileReplacement::FileReplacement(const std::string& path) try
     OpenTemporary(kModeOfNewFiles);
   } else if (S_ISREG(old.st_mode)) {
     // A file that may not be written may not be replaced either.
-    if (::faccessat(AT_FDCWD, target_.c_str(), W_OK, AT_EACCESS) != 0) {
+    // One that somebody has removed since is no hindrance.
+    if (::faccessat(AT_FDCWD, target_.c_str(), W_OK, AT_EACCESS) != 0 && errno != ENOENT) {
       Fail(errno);
     }
     OpenTemporary(old.st_mode & kModeBits);
