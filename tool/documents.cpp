@@ -1,9 +1,7 @@
 #include "documents.h"
 
 #include <algorithm>
-#include <array>
 #include <cerrno>
-#include <cstdio>
 #include <exception>
 #include <filesystem>
 #include <sstream>
@@ -18,24 +16,11 @@
 #include "aldermoor/vexdoc/vexexception.h"
 
 #include "diagnostics.h"
+#include "inputfile.h"
 #include "output.h"
 
 namespace Aldermoor::Tool {
 namespace {
-
-std::string ReadStandardInput() {
-  std::string text;
-  std::array<char, 65536> chunk;
-  std::size_t count = 0;
-  errno = 0;
-  while ((count = std::fread(chunk.data(), 1, chunk.size(), stdin)) > 0) {
-    text.append(chunk.data(), count);
-  }
-  if (std::ferror(stdin) != 0) {
-    throw std::system_error(errno, std::generic_category());
-  }
-  return text;
-}
 
 // The library would say no more than that it is not accessible.
 void CheckIsFile(const std::string& path) {
@@ -66,10 +51,10 @@ std::string Reason(const std::exception& e) {
 
 void LoadDocument(const std::string& path, Vexdoc::VEX& document) {
   const bool standard = path == kStandardStream;
-  const std::string shown = standard ? "<standard input>" : path;
+  const std::string shown = ShownPath(path);
+  std::istringstream in(standard ? ReadBytes(path) : "");
   try {
     if (standard) {
-      std::istringstream in(ReadStandardInput());
       document.Load(in);
     } else {
       CheckIsFile(path);

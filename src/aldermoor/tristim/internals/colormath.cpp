@@ -3,13 +3,14 @@
 #include <algorithm>
 #include <cmath>
 #include <cstddef>
+#include <numbers>
 
 #include "aldermoor/tristim/hxspectrum.h"
 
 namespace Aldermoor::Tristim::Internals {
 namespace {
 
-constexpr double kPi = 3.141592653589793;
+using std::numbers::pi;
 
 double Widen(float value) {
   return static_cast<double>(value);
@@ -138,17 +139,17 @@ Triple LchHxFromLch(const Triple& lch) noexcept {
 
   constexpr std::array<float, 4> kCos = {-0.09622F, -0.06742F, -0.02137F, 0.00587F};
   constexpr std::array<float, 4> kSin = {0.13893F, -0.0539F, -0.04029F, -0.01043F};
-  const auto r = static_cast<float>(Widen(lch[2]) * kPi / 180.0);
+  const auto r = static_cast<float>(Widen(lch[2]) * pi / 180.0);
   float hue = 0.17914F + r;
   for (std::size_t n = 0; n < kCos.size(); ++n) {
     const float angle = static_cast<float>(n + 1) * r;
     hue = hue + std::cos(angle) * kCos[n] + std::sin(angle) * kSin[n];
   }
-  return {lightness, static_cast<float>(chroma), hue * 180.0F / static_cast<float>(kPi)};
+  return {lightness, static_cast<float>(chroma), hue * 180.0F / static_cast<float>(pi)};
 }
 
 Triple LabHxFromLchHx(const Triple& lch) noexcept {
-  const double angle = Widen(lch[2]) * kPi / 180.0;
+  const double angle = Widen(lch[2]) * pi / 180.0;
   return {lch[0], static_cast<float>(Widen(lch[1]) * std::cos(angle)),
           static_cast<float>(Widen(lch[1]) * std::sin(angle))};
 }

@@ -5,11 +5,12 @@
 #include <cstddef>
 #include <iterator>
 #include <limits>
+#include <numbers>
 
 namespace Aldermoor::Tristim::Internals {
 namespace {
 
-constexpr double kPi = 3.141592653589793;
+using std::numbers::pi;
 constexpr double kDegreesPerRadian = 57.29577951308232;
 
 double Widen(float value) {
@@ -33,11 +34,11 @@ double Square(double value) {
 }
 
 double CosDegrees(double degrees) {
-  return std::cos(degrees / 360.0 * 2.0 * kPi);
+  return std::cos(degrees / 360.0 * 2.0 * pi);
 }
 
 double SinDegrees(double degrees) {
-  return std::sin(degrees / 360.0 * 2.0 * kPi);
+  return std::sin(degrees / 360.0 * 2.0 * pi);
 }
 
 // sqrt(c^7 / (c^7 + 25^7))
@@ -97,7 +98,7 @@ float DeltaECmc(const Quadruple& first, const Quadruple& second, float l, float 
   const float f = std::sqrt(chroma4 / (chroma4 + 1900.0F));
   const bool is_blue_side = hue >= 164.0F && hue <= 345.0F;
   const float doubled = ((is_blue_side ? 168.0F : 35.0F) + hue) * 2.0F;
-  const double wave = std::cos(Widen(doubled) * kPi / 360.0);
+  const double wave = std::cos(Widen(doubled) * pi / 360.0);
   const auto t = static_cast<float>(is_blue_side ? 0.56 + std::abs(Widen(0.2F) * wave)
                                                  : 0.36 + std::abs(Widen(0.4F) * wave));
   const float sh = (f * t + 1.0F - f) * sc;
@@ -123,10 +124,10 @@ float DeltaE2000(const Quadruple& first, const Quadruple& second, const Triple& 
     hue[i] = a == 0.0 && b == 0.0 ? 0.0 : std::atan2(b, a);
   }
   double turn = hue[1] - hue[0];
-  if (turn > kPi) {
-    turn -= 2.0 * kPi;
-  } else if (turn < -kPi) {
-    turn += 2.0 * kPi;
+  if (turn > pi) {
+    turn -= 2.0 * pi;
+  } else if (turn < -pi) {
+    turn += 2.0 * pi;
   }
   if (std::isnan(hue[0]) || std::isnan(hue[1])) {
     return kNoDeltaE;

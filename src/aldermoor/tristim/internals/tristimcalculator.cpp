@@ -1,5 +1,7 @@
 #include "aldermoor/tristim/internals/tristimcalculator.h"
 
+#include <numbers>
+
 #include "aldermoor/tristim/internals/colormath.h"
 #include "aldermoor/tristim/internals/hxlab.h"
 #include "aldermoor/tristim/internals/hxlch.h"
@@ -13,7 +15,7 @@ namespace {
 
 namespace Words = Vocabulary;
 
-constexpr double kPi = 3.141592653589793;
+using std::numbers::pi;
 
 /// So little light that only its chromaticity counts; it stands in for that of black.
 constexpr float kAlmostBlack = 1e-5F;
@@ -327,11 +329,11 @@ bool TristimCalculator::GetNormValence(const HXMeasureConditions& conditions,
 ALDERMOOR_FRAME(Aldermoor::Tristim::Internals::TristimCalculator::GetNormValence)
 
 double TristimCalculator::DegToRad(double degrees) {
-  return degrees / 360.0 * 2.0 * kPi;
+  return degrees / 360.0 * 2.0 * pi;
 }
 
 double TristimCalculator::RadToDeg(double radians) {
-  return radians * 360.0 / (2.0 * kPi);
+  return radians * 360.0 / (2.0 * pi);
 }
 
 }  // namespace Aldermoor::Tristim::Internals
