@@ -9,7 +9,7 @@ std::string ReasonOfFailure(const Vexdoc::Conditions& conditions, const std::str
   const Tristim::HXMeasureConditions typed = Vexdoc::ToMeasureConditions(conditions);
   if (typed.GetWhiteBase() == Tristim::WhiteBase::Paper &&
       Tristim::Internals::BaseCalculator::GetPaperWhitePointer().IsNull()) {
-    return what + " cannot be computed: the white base is \"Paper\" and " + kNoPaperWhite;
+    return what + " cannot be computed: " + NoPaperWhite();
   }
   return what + " cannot be computed";
 }

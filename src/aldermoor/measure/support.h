@@ -16,6 +16,11 @@ std::string ReasonOfFailure(const Vexdoc::Conditions& conditions, const std::str
 
 inline constexpr const char* kNoPaperWhite = "there is no paper white";
 
+/// Why what is relative to paper has no value.
+inline std::string NoPaperWhite() {
+  return std::string("the white base is \"Paper\" and ") + kNoPaperWhite;
+}
+
 /// Runs `compute` and turns a failure of colorimetry into a MeasureException.  A text that begins
 /// with its name says nothing of the cause, so `reason()` does.
 template <class Compute, class Reason>

@@ -5,6 +5,7 @@
 #include "aldermoor/tristim/internals/colorrenderingcalculator.h"
 #include "aldermoor/tristim/internals/colortemperature.h"
 #include "aldermoor/tristim/internals/deltaemath.h"
+#include "aldermoor/tristim/internals/failuretexts.h"
 #include "aldermoor/tristim/internals/lab2spec.h"
 #include "aldermoor/tristim/internals/tristimcalculator.h"
 #include "aldermoor/tristim/internals/vocabulary.h"
@@ -18,10 +19,6 @@ namespace Words = Vocabulary;
 using Calculator = Internals::TristimCalculator;
 
 constexpr char kCalculatorFailed[] = "TristimCalculator";
-constexpr char kNoColorSpace[] = "GetVector not supported for ColorSpace ";
-constexpr char kNoConversionFrom[] = "Conversion not supported from ColorSpace ";
-constexpr char kNoConversionTo[] = " to ColorSpace ";
-constexpr char kNoFormula[] = "GetDeltaE not supported for DeltaEFormula ";
 constexpr char kOutOfRange[] = "TristimCalculator: Conversion out of Range";
 constexpr char kRgbFailed[] = "Conversion failed from RGB to XYZ";
 
@@ -225,7 +222,7 @@ HXColorVector TristimService::GetVector(const HXSpectrum& spectrum,
                                         const HXMeasureConditions& conditions) try {
   const FromSpectrum run = FindWay(conditions.GetColorSpace());
   if (run == nullptr) {
-    throw TristimException(kNoColorSpace + conditions.GetColorSpace(),
+    throw TristimException(Internals::NoColorSpace(conditions.GetColorSpace()),
                            ALDERMOOR_HERE(Aldermoor::Tristim::TristimService::GetVector));
   }
   HXColorVector out;
@@ -245,7 +242,7 @@ HXColorVector TristimService::GetVector(const HXColorVector& vector,
   }
   const FromVector run = FindWay(from, colorSpace);
   if (run == nullptr) {
-    throw TristimException(kNoConversionFrom + from + kNoConversionTo + colorSpace,
+    throw TristimException(Internals::NoConversion(from, colorSpace),
                            ALDERMOOR_HERE(Aldermoor::Tristim::TristimService::GetVector));
   }
   HXColorVector out;
@@ -287,7 +284,7 @@ float TristimService::GetDeltaE(const HXSpectrum& first, const HXSpectrum& secon
                                 float weight3) try {
   const FormulaRow* const row = FindFormula(conditions.GetDeltaEFormula());
   if (row == nullptr) {
-    throw TristimException(kNoFormula + conditions.GetDeltaEFormula(),
+    throw TristimException(Internals::NoFormula(conditions.GetDeltaEFormula()),
                            ALDERMOOR_HERE(Aldermoor::Tristim::TristimService::GetDeltaE));
   }
   const Weights weights = WithUsual({weight1, weight2, weight3}, row->usual);

@@ -52,15 +52,19 @@ Triple XyzFromLab(const Triple& lab, const Triple& white) noexcept {
   return xyz;
 }
 
+float HueOf(float a, float b) noexcept {
+  if (std::abs(a) < 1e-5F && std::abs(b) < 1e-5F) {
+    return 360.0F;
+  }
+  const float hue = std::atan2(b, a) * 57.29577951308232F;
+  return hue <= 0.0F ? hue + 360.0F : hue;
+}
+
 Triple PolarFromRectangular(const Triple& rectangular) noexcept {
   const float a = rectangular[1];
   const float b = rectangular[2];
   const float chroma = std::sqrt(a * a + b * b);
-  if (std::abs(a) < 1e-5F && std::abs(b) < 1e-5F) {
-    return {rectangular[0], chroma, 360.0F};
-  }
-  const float hue = std::atan2(b, a) * 57.29577951308232F;
-  return {rectangular[0], chroma, hue <= 0.0F ? hue + 360.0F : hue};
+  return {rectangular[0], chroma, HueOf(a, b)};
 }
 
 Triple XyYFromXyz(const Triple& xyz) noexcept {

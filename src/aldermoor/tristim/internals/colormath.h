@@ -17,6 +17,9 @@ using Quadruple = std::array<float, 4>;
 /// The 36 weights of X, Y, Z.
 using AxisWeights = std::array<const float*, 3>;
 
+/// So little light in every band that only its chromaticity counts; it stands in for that of black.
+inline constexpr float kAlmostBlack = 1e-5F;
+
 /// Dot products of the weights with 36 bands, each accumulated from band 0 upward.
 Triple XyzFromSpectrum(const AxisWeights& weights, const float* spectrum) noexcept;
 
@@ -27,8 +30,9 @@ Triple LabFromXyz(const Triple& xyz, const Triple& white) noexcept;
 /// The way back; a lightness of 0 that was clamped stays 0.
 Triple XyzFromLab(const Triple& lab, const Triple& white) noexcept;
 
-/// Polar form of any rectangular triple.  The hue of the neutral axis and of the positive first
-/// axis is 360, never 0.
+/// The hue of a direction; that of the neutral axis and of the positive first axis is 360, never 0.
+float HueOf(float a, float b) noexcept;
+/// Polar form of any rectangular triple.
 Triple PolarFromRectangular(const Triple& rectangular) noexcept;
 
 /// x, y, Y; X + Y + Z is not 0.

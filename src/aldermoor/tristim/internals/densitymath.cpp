@@ -32,6 +32,10 @@ float DensityOf(float reflectance) noexcept {
   return reflectance > 0.0F ? -std::log10(reflectance) : kGreatestDensity;
 }
 
+Quadruple DensitiesOfSums(const Quadruple& sums) noexcept {
+  return {DensityOf(sums[0]) + 2.0F, DensityOf(sums[1]), DensityOf(sums[2]), DensityOf(sums[3])};
+}
+
 Quadruple DensitiesOf(const DensityWeights& weights, const float* spectrum) noexcept {
   Quadruple sums{};
   for (std::size_t j = 0; j < HXSpectrum::kBands; ++j) {
@@ -40,7 +44,7 @@ Quadruple DensitiesOf(const DensityWeights& weights, const float* spectrum) noex
     sums[2] += spectrum[j] * weights[2][j];
     sums[3] += spectrum[j] * weights[3][j];
   }
-  return {DensityOf(sums[0]) + 2.0F, DensityOf(sums[1]), DensityOf(sums[2]), DensityOf(sums[3])};
+  return DensitiesOfSums(sums);
 }
 
 Triple SortedColors(const Quadruple& densities) noexcept {

@@ -22,8 +22,9 @@ using DensityWeights = std::array<const float*, 4>;
 
 [[nodiscard]] float DensityOf(float reflectance) noexcept;
 
-/// Each channel summed from band 0 upward.  The visual weights add up to 100 and not to 1, which 2
-/// on the density makes up for.
+/// The visual weights add up to 100 and not to 1, which 2 on the density makes up for.
+[[nodiscard]] Quadruple DensitiesOfSums(const Quadruple& sums) noexcept;
+/// Each channel summed from band 0 upward.
 [[nodiscard]] Quadruple DensitiesOf(const DensityWeights& weights, const float* spectrum) noexcept;
 
 /// Cyan, magenta and yellow in descending order.

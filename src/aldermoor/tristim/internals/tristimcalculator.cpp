@@ -17,9 +17,6 @@ namespace Words = Vocabulary;
 
 using std::numbers::pi;
 
-/// So little light that only its chromaticity counts; it stands in for that of black.
-constexpr float kAlmostBlack = 1e-5F;
-
 Triple TripleOf(const HXColorVector& vector) {
   return {vector[0], vector[1], vector[2]};
 }
