@@ -26,7 +26,7 @@ std::string Rounded(double value) {
 }
 
 std::string TargetOf(const Figure& figure) {
-  return figure.target ? Rounded(*figure.target) : kNone;
+  return figure.target ? (figure.more_is_better ? ">=" : "<=") + Rounded(*figure.target) : kNone;
 }
 
 const char* ResultOf(const Figure& figure) {

@@ -8,14 +8,17 @@
 
 namespace Aldermoor::Benchmarks {
 
-/// One result of a run.  A target is the greatest value that is still good.
+/// One result of a run.  A target is the greatest value that is still good, or the least one.
 struct Figure {
   std::string name;
   double value;
   std::string unit;
   std::optional<double> target;
+  bool more_is_better = false;
 
-  bool IsMissed() const { return target && !(value <= *target); }
+  bool IsMissed() const {
+    return target && !(more_is_better ? value >= *target : value <= *target);
+  }
 };
 
 using Figures = std::vector<Figure>;

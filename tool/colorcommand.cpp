@@ -1,21 +1,21 @@
 #include <cstddef>
 #include <memory>
-#include <stdexcept>
+#include <span>
 #include <string>
 #include <vector>
 
 #include <CLI/CLI.hpp>
-#include <fmt/format.h>
 
 #include "aldermoor/vexdoc/colorvector.h"
 #include "aldermoor/vexdoc/sample.h"
 
+#include "colorbatch.h"
 #include "coloroptions.h"
 #include "command.h"
 #include "documents.h"
+#include "jobs.h"
 #include "output.h"
 #include "records.h"
-#include "requestedcolor.h"
 #include "samplerun.h"
 #include "vocabulary.h"
 
@@ -43,29 +43,31 @@ std::vector<Column> ChannelColumns(const Vexdoc::Conditions& request) {
 /// Asks every sample for one colour and writes what comes back.
 class ColorJob : public SampleJob {
  public:
-  ColorJob(const Vexdoc::Conditions& request, Format format, Output& output, bool with_file)
-      : request_(request),
-        columns_(ChannelColumns(request)),
+  ColorJob(const Vexdoc::Conditions& request, const JobOptions& jobs, Format format, Output& output,
+           bool with_file)
+      : columns_(ChannelColumns(request)),
+        batch_(request, columns_.size(), jobs),
         table_(format, output, with_file, columns_, request.GetAttributes()) {}
 
   void Add(const Place& place, const Vexdoc::Sample& sample) override {
-    const Vexdoc::ColorVector color = RequestedColor(sample, request_);
-    const auto& channels = color.GetDatastore();
-    if (channels.size() != columns_.size()) {
-      throw std::runtime_error(fmt::format("the colour has {} channels", channels.size()));
+    batch_.Add(place, sample);
+    if (batch_.IsFull()) {
+      EndDocument();
     }
-    cells_.clear();
-    for (const auto& channel : channels) {
-      cells_.emplace_back(channel.second);
-    }
-    table_.Add(place, cells_);
+  }
+
+  void EndDocument() override {
+    batch_.Flush([this](const Place& place, std::span<const float> color) {
+      cells_.assign(color.begin(), color.end());
+      table_.Add(place, cells_);
+    });
   }
 
   void End() override { table_.GetWriter().End(); }
 
  private:
-  const Vexdoc::Conditions& request_;
   const std::vector<Column> columns_;
+  ColorBatch batch_;
   std::vector<Cell> cells_;  // reused
   SampleTable table_;
 };
@@ -76,6 +78,7 @@ class ColorCommand : public Command {
     inputs_.AddTo(app);
     color_.AddTo(app);
     filter_.AddTo(app);
+    jobs_.AddTo(app);
     output_.AddTo(app, "table csv json");
   }
 
@@ -84,7 +87,7 @@ class ColorCommand : public Command {
     inputs_.CheckStandardInput(color_.GetIlluminantFile());
     const Vexdoc::Conditions request = color_.MakeConditions();
     Output output(output_.path);
-    ColorJob job(request, format, output, inputs_.paths.size() > 1);
+    ColorJob job(request, jobs_, format, output, inputs_.paths.size() > 1);
     return RunOverSamples(job, inputs_, filter_, output);
   }
 
@@ -92,6 +95,7 @@ class ColorCommand : public Command {
   InputOptions inputs_;
   ColorOptions color_;
   SampleFilter filter_;
+  JobOptions jobs_;
   OutputOptions output_;
 };
 

@@ -6,7 +6,7 @@
 #include <memory>
 #include <numeric>
 #include <optional>
-#include <stdexcept>
+#include <span>
 #include <string>
 #include <string_view>
 #include <utility>
@@ -15,17 +15,15 @@
 #include <CLI/CLI.hpp>
 #include <fmt/format.h>
 
-#include "aldermoor/measure/colordifference.h"
-#include "aldermoor/vexdoc/colorvector.h"
 #include "aldermoor/vexdoc/conditions.h"
-#include "aldermoor/vexdoc/spectrum.h"
 
 #include "coloroptions.h"
 #include "command.h"
+#include "comparison.h"
 #include "documents.h"
+#include "jobs.h"
 #include "output.h"
 #include "records.h"
-#include "requestedcolor.h"
 #include "samplepairs.h"
 #include "samplerun.h"
 #include "text.h"
@@ -33,8 +31,6 @@
 
 namespace Aldermoor::Tool {
 namespace {
-
-const std::string kFormulaKey = "ColorSpaceDescription.DeltaEFormula";
 
 struct Difference {
   float value;
@@ -65,53 +61,6 @@ struct Statistics {
   float median;
   float p95;
   Difference worst;
-};
-
-/// How two samples are compared.
-struct Comparison {
-  std::string formula;
-  Measure::DifferenceWeights weights;
-  Vexdoc::Conditions request;  // of a colour in CIELab
-
-  float Between(const Vexdoc::Sample& reference, const Vexdoc::Sample& sample) const {
-    const float difference = HasBands(reference) && HasBands(sample)
-                                 ? BetweenSpectra(reference, sample)
-                                 : BetweenColors(reference, sample);
-    if (!std::isfinite(difference)) {
-      throw std::runtime_error("the difference is no number");
-    }
-    return difference;
-  }
-
- private:
-  static bool HasBands(const Vexdoc::Sample& sample) {
-    const Vexdoc::Spectrum* const spectrum = FindSpectrum(sample);
-    return spectrum != nullptr && spectrum->GetData().size() == kBands;
-  }
-
-  float BetweenSpectra(const Vexdoc::Sample& reference, const Vexdoc::Sample& sample) const {
-    Vexdoc::Conditions conditions = request;
-    conditions.AddAttribute(kFormulaKey, formula);
-    const Vexdoc::Spectrum& first =
-        OnReference([&]() -> const Vexdoc::Spectrum& { return ReflectanceOf(reference); });
-    return Measure::ColorDifference(first, ReflectanceOf(sample), conditions, weights);
-  }
-
-  float BetweenColors(const Vexdoc::Sample& reference, const Vexdoc::Sample& sample) const {
-    const Vexdoc::ColorVector first = OnReference([&] { return ColorOf(reference); });
-    Vexdoc::Conditions conditions = *first.GetConditions();
-    conditions.AddAttribute(kFormulaKey, formula);
-    return Measure::ColorDifference(Vexdoc::ColorVector(conditions, first.GetDatastore()),
-                                    ColorOf(sample), weights);
-  }
-
-  Vexdoc::ColorVector ColorOf(const Vexdoc::Sample& sample) const {
-    Vexdoc::ColorVector color = RequestedColor(sample, request);
-    if (color.GetConditions()->GetAttribute(kIlluminationKey, "") == kEmission) {
-      throw std::runtime_error("the colour is that of a light, not of a reflecting sample");
-    }
-    return color;
-  }
 };
 
 /// Writes differences and what they come to.
@@ -226,6 +175,7 @@ class DiffCommand : public Command {
     app.add_flag("--summary", only_summary_, "Leave out the single differences");
     color_.AddViewingTo(app);
     filter_.AddTo(app);
+    jobs_.AddTo(app);
     output_.AddTo(app, "table csv json");
   }
 
@@ -295,15 +245,24 @@ class DiffCommand : public Command {
     return comparison;
   }
 
+  static constexpr std::size_t kPairsAtOnce = 65536;
+
   bool Compare(const Comparison& comparison, const Vexdoc::VEX& reference, const std::string& path,
                const Vexdoc::VEX& document, DiffReport& report) const {
     const SamplePairs matched(reference_, reference, path, document, filter_);
     bool complete = matched.ReportUnpaired();
-    for (const SamplePair& pair : matched.pairs) {
-      const Place place{path, pair.set, pair.name};
-      complete &= TryFor(place, *pair.sample, [&] {
-        report.Add(place, comparison.Between(*pair.reference, *pair.sample));
-      });
+    for (std::size_t first = 0; first < matched.pairs.size(); first += kPairsAtOnce) {
+      const auto pairs = std::span(matched.pairs)
+                             .subspan(first, std::min(kPairsAtOnce, matched.pairs.size() - first));
+      const auto differences = comparison.BetweenSpectra(pairs, jobs_);
+      for (std::size_t i = 0; i < pairs.size(); ++i) {
+        const SamplePair& pair = pairs[i];
+        const Place place{path, pair.set, pair.name};
+        complete &= TryFor(place, *pair.sample, [&] {
+          report.Add(place, differences[i] ? *differences[i]
+                                           : comparison.Between(*pair.reference, *pair.sample));
+        });
+      }
     }
     return report.EndFile(path, complete) && complete;
   }
@@ -316,6 +275,7 @@ class DiffCommand : public Command {
   bool only_summary_ = false;
   ColorOptions color_;
   SampleFilter filter_;
+  JobOptions jobs_;
   OutputOptions output_;
 };
 

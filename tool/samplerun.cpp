@@ -112,6 +112,7 @@ ExitStatus RunOverSamples(SampleJob& job, const InputOptions& inputs, const Samp
       failed |= !TryFor(place, sample, [&] { job.Add(place, sample); });
       progress.Step();
     });
+    job.EndDocument();
   };
   ExitStatus status = inputs.ForEachDocument(visit);
   if (documents == 0) {

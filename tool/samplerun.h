@@ -83,6 +83,8 @@ class SampleJob {
   virtual void Begin(const std::string& /*path*/, const Vexdoc::VEX& /*document*/) {}
   /// What it throws is reported as the failure of this sample.
   virtual void Add(const Place& place, const Vexdoc::Sample& sample) = 0;
+  /// Called behind the samples of a document, which is gone after that.
+  virtual void EndDocument() {}
   /// Called once, if any document could be read.
   virtual void End() = 0;
 };
