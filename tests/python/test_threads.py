@@ -1,0 +1,61 @@
+"""Threads: the interpreter runs on during work, and nothing gets mixed up."""
+
+import threading
+from collections.abc import Callable
+from concurrent.futures import ThreadPoolExecutor
+
+import numpy
+import pytest
+from conftest import EXAMPLES
+from numpy.typing import NDArray
+
+import aldermoor
+
+RANDOM = numpy.random.default_rng(5)
+SPECTRA: NDArray[numpy.float32] = RANDOM.random((20_000, 36), numpy.float32)
+
+
+@pytest.mark.parametrize(
+    "work",
+    [
+        lambda: [aldermoor.convert(SPECTRA, "LCHhx") for _ in range(20)],
+        lambda: aldermoor.color_temperature(SPECTRA[:5000]),
+    ],
+    ids=["convert", "color_temperature"],
+)
+def test_the_interpreter_is_free_during_work(work: Callable[[], object]) -> None:
+    thread = threading.Thread(target=work)
+    thread.start()
+    turns = 0
+    while thread.is_alive() and turns < 3:
+        turns += 1
+        thread.join(0.001)  # comes back late, and then only once, if the interpreter is held
+    assert turns == 3
+    thread.join()
+
+
+def build() -> bytes:
+    document = aldermoor.Document("d")
+    document.set_header("Created", "")
+    for number in range(30):
+        sample = document.add_set(f"set {number}").add_sample("s")
+        sample.add_spectrum(SPECTRA[number])
+        sample.add_color(sample.color(illuminant="F2"), illuminant="F2")
+    return b"".join(line for line in document.dumps().split(b"\n") if b"ed>" not in line)
+
+
+def test_threads_do_not_disturb_each_other() -> None:
+    jobs: list[Callable[[], object]] = [
+        build,
+        lambda: aldermoor.load(EXAMPLES / "chart24.xml").colors(illuminant="A").values.tolist(),
+        lambda: aldermoor.convert(SPECTRA[:2000], illuminant="F7").tolist(),
+        lambda: aldermoor.delta_e(SPECTRA[:2000], SPECTRA[1], illuminant="C").tolist(),
+        lambda: aldermoor.color_temperature(SPECTRA[:100]).tolist(),
+        lambda: aldermoor.density(SPECTRA[:2000], paper=SPECTRA[3]).tolist(),
+        lambda: aldermoor.reconstruct(numpy.full((20, 3), 40, numpy.float32)).tolist(),
+    ]
+    expected = [repr(job()) for job in jobs]
+    with ThreadPoolExecutor(8) as pool:
+        rounds = [[pool.submit(job) for job in jobs] for _ in range(10)]
+        for futures in rounds:
+            assert [repr(future.result()) for future in futures] == expected
