@@ -47,7 +47,7 @@ ANY: Any = aldermoor
             ValueError,
             "out: overlaps",
         ),
-        (lambda: aldermoor.delta_e(ONES, numpy.ones((3, 36), numpy.float32)), ValueError, "2 and 3"),
+        (lambda: aldermoor.delta_e(ONES, ONES[[0, 0, 1]]), ValueError, "2 and 3 rows"),
         (lambda: ANY.delta_e(ONES, ONES, "1976"), ValueError, "formula: '1976' is none of"),
         (lambda: ANY.density(ONES, "User"), ValueError, "standard: 'User' is none of DIN"),
         (lambda: aldermoor.reconstruct(LAB, "CIELCh"), ValueError, "source: 'CIELCh' is none of"),
