@@ -1,0 +1,37 @@
+"""The exceptions of the package."""
+
+from __future__ import annotations
+
+
+class Error(Exception):
+    """A failure of the library; the text says why."""
+
+    trace: tuple[str, ...] = ()
+    """Places in the code of the library that the failure passed, innermost first."""
+
+
+class FileError(Error, OSError):
+    """A file cannot be read or written; the text has the reason of the system."""
+
+
+class ParseError(Error, ValueError):
+    """What is read is no document; the text says what is wrong.
+
+    `file`, `line` and `column`, counted from 1, where the text is not well-formed XML.
+    """
+
+    file: str | None = None
+    line: int | None = None
+    column: int | None = None
+
+
+class NotFoundError(Error, LookupError):
+    """There is no such set, sample or attribute, and nothing that could give it."""
+
+
+class MissingConditionError(Error, ValueError):
+    """A value comes without a condition that it must have."""
+
+
+class MeasureError(Error, ValueError):
+    """A value cannot be computed."""

@@ -1,0 +1,216 @@
+#include <algorithm>
+#include <array>
+#include <limits>
+#include <optional>
+#include <string>
+
+#include <pybind11/numpy.h>
+#include <pybind11/stl.h>
+
+#include "aldermoor/measure/context.h"
+#include "aldermoor/vexdoc/colorvector.h"
+
+#include "lock.h"
+#include "module.h"
+#include "request.h"
+#include "rows.h"
+
+namespace Aldermoor::Python {
+namespace {
+
+namespace py = pybind11;
+using FloatArray = py::array_t<float>;
+using Measure::Context;
+using Measure::kBands;
+
+constexpr float kNaN = std::numeric_limits<float>::quiet_NaN();
+const std::string kSpectra = "Spectrum";
+
+/// What an array holds, and under which conditions.
+struct Source {
+  Source(const std::string& source, const Viewing& viewing, const py::object& paper)
+      : word(source), view(viewing), paper_white(ReadPaper(paper)) {
+    CheckWord("source", word, "SOURCES");
+  }
+
+  bool IsSpectra() const { return word == kSpectra; }
+
+  // With what the result is to be under `key`.
+  Context MakeContext(const char* key, const std::string& value) const {
+    const LibraryLock lock;
+    Vexdoc::Conditions target = MakeConditions(view);
+    if (paper_white) {
+      target.AddAttribute("Colorimetric.WhiteBase", "Paper");
+    }
+    Vexdoc::Conditions own;
+    if (!IsSpectra()) {
+      own = target;
+      own.AddAttribute("ColorSpaceDescription.Type", word);
+    }
+    target.AddAttribute(key, value);
+    return Context(target, own, paper_white);
+  }
+
+  Rows Read(const char* argument, const py::object& values, const Context& context) const {
+    return IsSpectra() ? Rows(argument, values, kBands, Rows::Layout::kAnyStride)
+                       : Rows(argument, values, context.GetSourceChannels(), Rows::Layout::kDense);
+  }
+
+  std::string word;
+  Viewing view;
+  std::optional<Bands> paper_white;
+};
+
+Measure::SpectrumRows Spectra(const Rows& rows) {
+  return {rows.GetValues(), rows.GetStride()};
+}
+
+constexpr const char* kConvert =
+    R"(convert(values, space="CIELab", *, illuminant="D50", observer="TwoDegree", source="Spectrum", paper=None, out=None)
+--
+
+Colours of spectra, or of colours, in the colour space `space`.
+
+values: float32, shape (n, 36): reflectances, 1 = perfect reflector, at 380 nm to 730 nm by 10 nm;
+    with another `source`, colours of that space, shape (n, channels).  One row alone may come
+    without the axis of rows, and the result has none then either.
+illuminant: "D65", "F11" ..., a daylight as "6500K", 36 numbers of relative power, or "Emission"
+    for spectra of lights.  Colours are taken as those of this illuminant, not adapted to it.
+source: "Spectrum" or the colour space of `values`.
+paper: 36 reflectances to which the colours are relative.
+out: float32, shape (n, channels), C-contiguous: where the result goes.
+
+Returns float32, shape (n, channels), or `out`.  A row without a colour is NaN.
+Raises MeasureError if there is no way from the source to the space.)";
+
+FloatArray Convert(const py::object& values, const std::string& space, const py::object& illuminant,
+                   const std::string& observer, const std::string& source_word,
+                   const py::object& paper, const py::object& out) {
+  CheckWord("space", space, "COLOR_SPACES");
+  const Source source(source_word, {illuminant, observer}, paper);
+  const Context context = source.MakeContext("ColorSpaceDescription.Type", space);
+  const Rows rows = source.Read("values", values, context);
+  FloatArray result =
+      MakeResult(out, rows.GetCount(), rows.IsSingle(), context.GetTargetChannels());
+  const bool in_place = !source.IsSpectra() && result.data() == rows.GetValues().data() &&
+                        context.GetSourceChannels() == 3 && context.GetTargetChannels() == 3;
+  if (!in_place) {
+    CheckApart(result, rows);
+  }
+  const std::span<float> colors = ValuesOf(result);
+  const py::gil_scoped_release release;
+  if (source.IsSpectra()) {
+    context.ConvertSpectra(Spectra(rows), colors);
+  } else {
+    context.ConvertColors(rows.GetValues(), colors);
+  }
+  return result;
+}
+
+constexpr const char* kDeltaE =
+    R"(delta_e(a, b, formula="2000", *, weights=(0.0, 0.0, 0.0), illuminant="D50", observer="TwoDegree", source="Spectrum", paper=None, out=None)
+--
+
+Colour differences, row by row; one row on either side is compared with all of the other.
+
+a, b: as `values` of `convert`; `a` is the reference where the formula has one: "94", "CMC",
+    "FMCII".
+formula: "CIELab", "CIELuv", "LABhx", "FMCII", "CMC", "94", "2000"; for colours, one of "CIELab",
+    "CMC", "94", "2000".
+weights: l and c of "CMC", kL, kC and kH of "94" and "2000"; 0 for the usual one, 2:1 and 1:1:1.
+
+Returns float32, shape (n,), or `out`.  A difference that cannot be computed is NaN.)";
+
+FloatArray DeltaE(const py::object& a, const py::object& b, const std::string& formula,
+                  const std::array<float, 3>& weights, const py::object& illuminant,
+                  const std::string& observer, const std::string& source_word,
+                  const py::object& paper, const py::object& out) {
+  CheckWord("formula", formula, "FORMULAS");
+  const Source source(source_word, {illuminant, observer}, paper);
+  const Context context = source.MakeContext("ColorSpaceDescription.DeltaEFormula", formula);
+  const Rows first = source.Read("a", a, context);
+  const Rows second = source.Read("b", b, context);
+  const std::size_t counts[] = {first.GetCount(), second.GetCount()};
+  if (counts[0] != counts[1] && counts[0] != 1 && counts[1] != 1) {
+    throw py::value_error("a, b: " + std::to_string(counts[0]) + " and " +
+                          std::to_string(counts[1]) + " rows cannot be compared one by one");
+  }
+  FloatArray result = MakeResult(out, counts[0] == 1 ? counts[1] : counts[0],
+                                 first.IsSingle() && second.IsSingle(), 0);
+  CheckApart(result, first);
+  CheckApart(result, second);
+  const std::span<float> differences = ValuesOf(result);
+  const Measure::DifferenceWeights usual{weights[0], weights[1], weights[2]};
+  const py::gil_scoped_release release;
+  if (differences.empty()) {
+    return result;
+  }
+  const std::size_t failed =
+      source.IsSpectra()
+          ? context.CompareSpectra(Spectra(first), Spectra(second), differences, usual)
+          : context.CompareColors(first.GetValues(), second.GetValues(), differences, usual);
+  if (failed > 0) {
+    std::replace(differences.begin(), differences.end(), Measure::kNoDifference, kNaN);
+  }
+  return result;
+}
+
+constexpr const char* kDensity =
+    R"(density(values, standard="DIN", *, paper=None, out=None)
+--
+
+Densities of reflectance spectra: black (visual), cyan, magenta, yellow; uncalibrated.
+
+values: float32, shape (n, 36) or (36,), as for `convert`.
+standard: "DIN", "DINNB", "ANSIA", "ANSIE", "ANSII", "ANSIT", "SPI".
+paper: 36 reflectances whose densities are taken off.
+
+Returns float32, shape (n, 4), or `out`.)";
+
+FloatArray Density(const py::object& values, const std::string& standard, const py::object& paper,
+                   const py::object& out) {
+  CheckWord("standard", standard, "DENSITY_STANDARDS");
+  const Measure::DensityOptions options{Measure::DensityStandardOf(standard), !paper.is_none()};
+  const Context context({}, {}, ReadPaper(paper));
+  const Rows rows("values", values, kBands, Rows::Layout::kAnyStride);
+  FloatArray result = MakeResult(out, rows.GetCount(), rows.IsSingle(), 4);
+  CheckApart(result, rows);
+  const std::span<float> densities = ValuesOf(result);
+  const py::gil_scoped_release release;
+  context.MeasureDensities(Spectra(rows), options, densities);
+  return result;
+}
+
+constexpr const char* kChannels = R"(channels(space)
+--
+
+The labels of the channels of a colour space, in order: ("L*", "a*", "b*").)";
+
+py::tuple Channels(const std::string& space) {
+  const LibraryLock lock;
+  const Vexdoc::Conditions conditions = MakeConditions({py::str("D50"), "TwoDegree"}, space);
+  const Vexdoc::ColorVector black(conditions, std::vector<float>(space == "CMYK" ? 4 : 3));
+  py::list labels;
+  for (const auto& [label, value] : black.GetDatastore()) {
+    labels.append(label);
+  }
+  return py::tuple(labels);
+}
+
+}  // namespace
+
+void AddArrays(py::module_& module) {
+  using py::arg;
+  module.def("convert", &Convert, kConvert, arg("values"), arg("space") = "CIELab", py::kw_only(),
+             arg("illuminant") = "D50", arg("observer") = "TwoDegree", arg("source") = kSpectra,
+             arg("paper") = py::none(), arg("out") = py::none());
+  module.def("delta_e", &DeltaE, kDeltaE, arg("a"), arg("b"), arg("formula") = "2000",
+             py::kw_only(), arg("weights") = std::array<float, 3>{}, arg("illuminant") = "D50",
+             arg("observer") = "TwoDegree", arg("source") = kSpectra, arg("paper") = py::none(),
+             arg("out") = py::none());
+  module.def("density", &Density, kDensity, arg("values"), arg("standard") = "DIN", py::kw_only(),
+             arg("paper") = py::none(), arg("out") = py::none());
+  module.def("channels", &Channels, kChannels, arg("space"));
+}
+
+}  // namespace Aldermoor::Python

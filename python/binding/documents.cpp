@@ -1,0 +1,321 @@
+#include <algorithm>
+#include <map>
+#include <sstream>
+#include <string>
+#include <utility>
+#include <vector>
+
+#include <pybind11/stl.h>
+
+#include "aldermoor/utilities/exceptions/exceptions.h"
+#include "aldermoor/vexdoc/colorvector.h"
+#include "aldermoor/vexdoc/spectrum.h"
+#include "aldermoor/vexdoc/vex.h"
+#include "aldermoor/vexdoc/vexexception.h"
+
+#include "attributes.h"
+#include "errors.h"
+#include "lock.h"
+#include "module.h"
+#include "request.h"
+#include "samplevalues.h"
+
+namespace Aldermoor::Python {
+namespace {
+
+namespace py = pybind11;
+using Utilities::Exceptions::ResourceNotAvailableException;
+using Utilities::FileSystem::File;
+using Utilities::Tools::SmartPointer;
+using Vexdoc::Sample;
+using Vexdoc::SampleSet;
+using Vexdoc::VEX;
+
+// ---- files
+
+File FileOf(const py::object& path) {
+  return File(py::module_::import("os").attr("fsencode")(path).cast<std::string>());
+}
+
+Owner<VEX> Load(const py::object& path, bool cache) {
+  const File file = FileOf(path);
+  const LibraryLock lock;
+  const SmartPointer<VEX> document(new VEX);
+  try {
+    const LibraryAlone library;
+    document->LoadXML(file, cache);
+  } catch (const Vexdoc::VexParseException&) {
+    throw;
+  } catch (const Vexdoc::VexException& e) {
+    ThrowAs(file.IsAccessable(false) ? "ParseError" : "FileError", e);
+  }
+  return Owner<VEX>(document);
+}
+
+Owner<VEX> Loads(const std::string& text) {
+  std::istringstream in(text);
+  const LibraryLock lock;
+  const SmartPointer<VEX> document(new VEX);
+  try {
+    const LibraryAlone library;
+    document->Load(in);
+  } catch (const Vexdoc::VexParseException&) {
+    throw;
+  } catch (const Vexdoc::VexException& e) {
+    ThrowAs("ParseError", e);
+  }
+  return Owner<VEX>(document);
+}
+
+// Keeps the interpreter: the locale of the process is another one meanwhile.
+void Save(const VEX& document, const py::object& path, bool cache) {
+  File file = FileOf(path);
+  const LibraryLock lock;
+  try {
+    document.SaveXML(file, cache);
+  } catch (const ResourceNotAvailableException& e) {
+    ThrowAs("FileError", e);
+  }
+}
+
+py::bytes Dumps(const VEX& document) {
+  std::ostringstream out;
+  {
+    const LibraryAlone library;
+    document.Store(out);
+  }
+  return py::bytes(out.str());
+}
+
+// ---- building
+
+using Texts = std::map<std::string, std::string>;
+
+void Apply(const Texts& texts, Vexdoc::Conditions& conditions) {
+  for (const auto& [key, value] : texts) {
+    conditions.AddAttribute(key, value);
+  }
+}
+
+template <class Attribute>
+Owner<Attribute> Add(Sample& sample, Attribute* attribute) {
+  const SmartPointer<Attribute> added(attribute);
+  sample.AddSampleAttribute(added);
+  return Owner<Attribute>(added);
+}
+
+Owner<Vexdoc::Spectrum> AddSpectrum(Sample& sample, const std::vector<float>& values,
+                                    const Texts& texts) {
+  const LibraryLock lock;
+  Vexdoc::Conditions conditions = MakeSpectrumConditions(values.size());
+  Apply(texts, conditions);
+  return Add(sample, new Vexdoc::Spectrum(conditions, values));
+}
+
+Owner<Vexdoc::ColorVector> AddColor(Sample& sample, const std::vector<float>& values,
+                                    const std::string& space, const py::object& illuminant,
+                                    const std::string& observer, const Texts& texts) {
+  const LibraryLock lock;
+  Vexdoc::Conditions conditions = MakeConditions({illuminant, observer}, space);
+  Apply(texts, conditions);
+  return Add(sample, new Vexdoc::ColorVector(conditions, values));
+}
+
+// ---- classes
+
+/// The members of a container of named elements.
+template <class Container, class Element>
+void AddContainer(py::class_<Container, Owner<Container>>& type, const char* name) {
+  const auto list = [](const Container& self) {
+    const LibraryLock lock;
+    std::vector<Owner<Element>> elements;
+    for (const auto& [key, element] : self.GetElements()) {
+      elements.emplace_back(element);
+    }
+    return elements;
+  };
+  type.def_property_readonly(name, list, "All, in document order, as a new list.");
+  type.def("__iter__", [list](const Container& self) { return py::iter(py::cast(list(self))); });
+  type.def("__len__", [](const Container& self) {
+    const LibraryLock lock;
+    return self.Size();
+  });
+  type.def("__getitem__", [](const Container& self, const std::string& key) {
+    const LibraryLock lock;
+    return Owner<Element>(self.FindElement(key));
+  });
+  type.def("__contains__", [](const Container& self, const std::string& key) {
+    const LibraryLock lock;
+    const auto& elements = self.GetElements();
+    return std::any_of(elements.begin(), elements.end(),
+                       [&key](const auto& entry) { return entry.first == key; });
+  });
+  type.def("__delitem__", [](Container& self, const std::string& key) {
+    const LibraryLock lock;
+    self.RemoveElement(self.FindElement(key));
+  });
+  type.def(
+      "rename",
+      [](Container& self, const std::string& old_name, const std::string& new_name) {
+        const LibraryLock lock;
+        return self.RenameElement(old_name, new_name);
+      },
+      "rename(old, new)\n--\n\nReturns the new name, with a number behind it if it was taken.",
+      py::arg("old"), py::arg("new"));
+}
+
+/// The rows that a document or a set gives.
+template <class Container>
+void AddRows(py::class_<Container, Owner<Container>>& type) {
+  using py::arg;
+  type.def("spectra", py::overload_cast<const Container&>(&SpectraOf), R"(spectra()
+--
+
+The first spectrum of every sample: SampleRows with `values` of shape (n, 36), `names` and `sets`.
+
+A sample without a spectrum of 36 values has a row of NaN.)");
+  type.def("colors",
+           py::overload_cast<const Container&, const std::string&, const py::object&,
+                             const std::string&, const py::object&>(&ColorsOf),
+           R"(colors(space="CIELab", *, illuminant="D50", observer="TwoDegree", paper=None)
+--
+
+The colour of every sample: SampleRows with `values` of shape (n, channels), `names` and `sets`.
+
+Arguments as for Sample.color; a sample for which that fails has a row of NaN.)",
+           arg("space") = "CIELab", py::kw_only(), arg("illuminant") = "D50",
+           arg("observer") = "TwoDegree", arg("paper") = py::none());
+}
+
+void AddSampleClass(py::module_& module) {
+  using py::arg;
+  py::class_<Sample, Owner<Sample>> type(module, "Sample",
+                                         "One specimen with its measured and computed values.");
+  AddHeader(type);
+  type.def_property_readonly(
+      "attributes",
+      [](const Sample& self) {
+        const LibraryLock lock;
+        std::vector<Owner<Vexdoc::SampleAttribute>> attributes;
+        for (const auto& [name, attribute] : self.GetElements()) {
+          attributes.emplace_back(attribute);
+        }
+        return attributes;
+      },
+      "All, as a new list: Spectrum, ColorVector, Recipe, and Attribute for unknown kinds.");
+  type.def_property_readonly(
+      "spectrum",
+      [](const Sample& self) {
+        const LibraryLock lock;
+        return ToArray(SpectrumOf(self));
+      },
+      "The values of the first spectrum: float32, shape (36,) as a rule; a copy.");
+  type.def("color", &ColorOf,
+           R"(color(space="CIELab", *, illuminant="D50", observer="TwoDegree", paper=None)
+--
+
+The colour of the sample: a stored one that was measured so, else one computed from the spectrum,
+else one converted from a stored one.
+
+illuminant: "D65", "F11" ..., a daylight as "6500K", or 36 numbers of relative power.
+paper: 36 reflectances to which the colour is relative.
+
+Returns float32, shape (channels,).
+Raises NotFoundError or MeasureError if the sample cannot give it.)",
+           arg("space") = "CIELab", py::kw_only(), arg("illuminant") = "D50",
+           arg("observer") = "TwoDegree", arg("paper") = py::none());
+  type.def("add_spectrum", &AddSpectrum, R"(add_spectrum(values, conditions={})
+--
+
+Adds a spectrum and returns it.
+
+values: numbers, 1 = perfect reflector; for colours there must be 36, at 380 nm to 730 nm.
+conditions: what is not said is a reflectance at these wavelengths.)",
+           arg("values"), arg("conditions") = Texts());
+  type.def(
+      "add_color", &AddColor,
+      R"(add_color(values, space="CIELab", *, illuminant="D50", observer="TwoDegree", conditions={})
+--
+
+Adds a colour and returns it.
+
+values: a number for each channel.
+conditions: further ones.)",
+      arg("values"), arg("space") = "CIELab", py::kw_only(), arg("illuminant") = "D50",
+      arg("observer") = "TwoDegree", arg("conditions") = Texts());
+}
+
+void AddSetClass(py::module_& module) {
+  py::class_<SampleSet, Owner<SampleSet>> type(module, "SampleSet",
+                                               "Samples in order under unique names.");
+  AddHeader(type);
+  AddContainer<SampleSet, Sample>(type, "samples");
+  AddRows(type);
+  type.def(
+      "add_sample",
+      [](SampleSet& self, const std::string& name) {
+        const LibraryLock lock;
+        return Owner<Sample>(self.AddElement(name));
+      },
+      R"(add_sample(name)
+--
+
+Adds an empty sample and returns it; its name has a number behind it if `name` was taken.)",
+      py::arg("name"));
+}
+
+void AddDocumentClass(py::module_& module) {
+  using py::arg;
+  py::class_<VEX, Owner<VEX>> type(module, "Document",
+                                   "A document of measured colour: sample sets in order under "
+                                   "unique names.");
+  type.def(py::init([](const std::string& name) {
+             const LibraryLock lock;
+             return Owner<VEX>(new VEX(name));
+           }),
+           arg("name") = "");
+  AddHeader(type);
+  AddContainer<VEX, SampleSet>(type, "sets");
+  AddRows(type);
+  type.def(
+      "add_set",
+      [](VEX& self, const std::string& name) {
+        const LibraryLock lock;
+        return Owner<SampleSet>(self.AddElement(name));
+      },
+      R"(add_set(name)
+--
+
+Adds an empty set and returns it; its name has a number behind it if `name` was taken.)",
+      arg("name"));
+  type.def("save", &Save, R"(save(path, cache=False)
+--
+
+Writes the document as XML; with `cache`, a binary cache beside it too.
+
+The file is replaced as a whole, or stays as it was.  Raises FileError.)",
+           arg("path"), arg("cache") = false);
+  type.def("dumps", &Dumps, "dumps()\n--\n\nThe document as XML in UTF-8.");
+}
+
+}  // namespace
+
+void AddDocuments(py::module_& module) {
+  using py::arg;
+  AddAttributeClasses(module);
+  AddSampleClass(module);
+  AddSetClass(module);
+  AddDocumentClass(module);
+  module.def("load", &Load, R"(load(path, cache=False)
+--
+
+The document in an XML file, or in the cache beside it if that is newer.
+
+With `cache`, that is written after the XML was read.
+Raises FileError, or ParseError with the place where the file is no document.)",
+             arg("path"), arg("cache") = false);
+  module.def("loads", &Loads, "loads(text)\n--\n\nThe document in XML, as `dumps` gives it.",
+             arg("text"));
+}
+
+}  // namespace Aldermoor::Python

@@ -1,0 +1,108 @@
+#include "request.h"
+
+#include <algorithm>
+#include <charconv>
+#include <limits>
+#include <string_view>
+#include <vector>
+
+#include <pybind11/stl.h>
+
+namespace Aldermoor::Python {
+namespace {
+
+namespace py = pybind11;
+
+constexpr const char* kIllumination = "Colorimetric.Illumination";
+constexpr std::string_view kDaylight = "Dxx, Temperature:";
+
+// "6500" of "6500K" and of the library's own "Dxx, Temperature:6500".
+std::string_view TemperatureOf(std::string_view word) {
+  if (word.starts_with(kDaylight)) {
+    return word.substr(kDaylight.size());
+  }
+  return word.ends_with('K') ? word.substr(0, word.size() - 1) : std::string_view();
+}
+
+std::string IlluminationOf(const std::string& word) {
+  const std::string_view digits = TemperatureOf(word);
+  if (digits.empty()) {
+    CheckWord("illuminant", word, "ILLUMINANTS");
+    return word;
+  }
+  short kelvin = 0;  // as wide as the library keeps it
+  const auto [end, error] = std::from_chars(digits.data(), digits.data() + digits.size(), kelvin);
+  if (error != std::errc() || end != digits.data() + digits.size() || kelvin <= 0) {
+    throw py::value_error("illuminant: '" + word + "' is no daylight, which is 1K to " +
+                          std::to_string(std::numeric_limits<short>::max()) + "K");
+  }
+  return std::string(kDaylight) + std::to_string(kelvin);
+}
+
+}  // namespace
+
+void CheckWord(const char* argument, const std::string& word, const char* list) {
+  const py::tuple words = py::module_::import("aldermoor._words").attr(list);
+  if (!words.contains(word)) {
+    throw py::value_error(std::string(argument) + ": '" + word + "' is none of " +
+                          py::str(", ").attr("join")(words).cast<std::string>());
+  }
+}
+
+Bands ReadBands(const char* argument, const py::object& values) {
+  std::vector<float> numbers;
+  try {
+    numbers = values.cast<std::vector<float>>();
+  } catch (const py::cast_error&) {
+    throw py::type_error(std::string(argument) + ": expected 36 numbers, got " +
+                         py::repr(py::type::of(values)).cast<std::string>());
+  }
+  Bands bands{};
+  if (numbers.size() != bands.size()) {
+    throw py::value_error(std::string(argument) + ": expected 36 numbers, got " +
+                          std::to_string(numbers.size()));
+  }
+  std::copy(numbers.begin(), numbers.end(), bands.begin());
+  return bands;
+}
+
+std::optional<Bands> ReadPaper(const py::object& paper) {
+  return paper.is_none() ? std::nullopt : std::optional<Bands>(ReadBands("paper", paper));
+}
+
+Vexdoc::Conditions MakeConditions(const Viewing& viewing) {
+  CheckWord("observer", viewing.observer, "OBSERVERS");
+  Vexdoc::Conditions conditions;
+  conditions.AddAttribute("Colorimetric.Observer", viewing.observer);
+  if (py::isinstance<py::str>(viewing.illuminant)) {
+    conditions.AddAttribute(kIllumination, IlluminationOf(viewing.illuminant.cast<std::string>()));
+  } else {
+    conditions.AddAttribute(kIllumination, "Userdefined");
+    conditions.SetCustomIllumination(MakeSpectrum(ReadBands("illuminant", viewing.illuminant)));
+  }
+  return conditions;
+}
+
+Vexdoc::Conditions MakeConditions(const Viewing& viewing, const std::string& space) {
+  CheckWord("space", space, "COLOR_SPACES");
+  Vexdoc::Conditions conditions = MakeConditions(viewing);
+  conditions.AddAttribute("ColorSpaceDescription.Type", space);
+  return conditions;
+}
+
+Vexdoc::Conditions MakeSpectrumConditions(std::size_t count) {
+  Vexdoc::Conditions conditions;
+  conditions.AddAttribute("Physical.NumberOfDataPointsSpectrum", std::to_string(count));
+  conditions.AddAttribute("Physical.SpectrumType", "Remission");
+  if (count == kSpectrumBands) {
+    conditions.AddAttribute("Physical.WavelengthSpectrumMin", "380nm");
+    conditions.AddAttribute("Physical.WavelengthSpectrumMax", "730nm");
+  }
+  return conditions;
+}
+
+Vexdoc::Spectrum MakeSpectrum(const Bands& values) {
+  return {MakeSpectrumConditions(), std::vector<float>(values.begin(), values.end())};
+}
+
+}  // namespace Aldermoor::Python

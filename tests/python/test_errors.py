@@ -1,0 +1,98 @@
+"""Failures: the class, the text, the place."""
+
+from collections.abc import Callable
+from pathlib import Path
+from typing import Any
+
+import numpy
+import pytest
+from conftest import DATA
+
+import aldermoor
+
+ONES = numpy.ones((2, 36), numpy.float32)
+LAB = numpy.ones((2, 3), numpy.float32)
+# Arguments that no type checker lets through.
+ANY: Any = aldermoor
+
+
+@pytest.mark.parametrize(
+    ("call", "kind", "text"),
+    [
+        (lambda: ANY.convert([[1.0]]), TypeError, r"values: .*float32 .*\(n, 36\).*got list"),
+        (
+            lambda: ANY.convert(ONES.astype(float)),
+            TypeError,
+            r"got float64 with shape \(2, 36\); convert it with \.astype\(numpy\.float32\)",
+        ),
+        (lambda: ANY.convert(ONES.astype(">f4")), TypeError, r"\.astype\(numpy\.float32\)"),
+        (lambda: aldermoor.convert(ONES[:, :35]), ValueError, r"got \(2, 35\)"),
+        (lambda: aldermoor.convert(ONES[None]), ValueError, r"got \(1, 2, 36\)"),
+        (lambda: aldermoor.convert(LAB), ValueError, r"expected shape \(n, 36\)"),
+        (lambda: aldermoor.convert(ONES, source="CIELab"), ValueError, r"expected shape \(n, 3\)"),
+        (lambda: ANY.convert(ONES, "CIElab"), ValueError, "space: 'CIElab' is none of CIELab, "),
+        (lambda: ANY.convert(ONES, observer="2"), ValueError, "observer: '2' is none of"),
+        (lambda: ANY.convert(ONES, source="Lab"), ValueError, "source: 'Lab' is none of Spectrum"),
+        (lambda: aldermoor.convert(ONES, illuminant="D51"), ValueError, "illuminant: 'D51' is"),
+        (lambda: aldermoor.convert(ONES, illuminant="0K"), ValueError, "'0K' is no daylight"),
+        (lambda: aldermoor.convert(ONES, illuminant="99999K"), ValueError, "is no daylight"),
+        (lambda: aldermoor.convert(ONES, illuminant=[1, 2]), ValueError, "36 numbers, got 2"),
+        (lambda: ANY.convert(ONES, illuminant=7), TypeError, "illuminant: expected 36 numbers"),
+        (lambda: aldermoor.convert(ONES, paper=[1.0]), ValueError, "paper: expected 36 numbers"),
+        (lambda: aldermoor.convert(ONES, "CMYK"), aldermoor.MeasureError, "."),
+        (lambda: aldermoor.convert(ONES, out=LAB[:1]), ValueError, r"out: expected shape \(2, 3\)"),
+        (lambda: aldermoor.convert(ONES, out=ONES[:, :3]), ValueError, "out: .*C-contiguous"),
+        (
+            lambda: aldermoor.convert(ONES, out=ONES.reshape(-1)[:6].reshape(2, 3)),
+            ValueError,
+            "out: overlaps",
+        ),
+        (lambda: aldermoor.delta_e(ONES, ONES[[0, 0, 1]]), ValueError, "2 and 3 rows"),
+        (lambda: ANY.delta_e(ONES, ONES, "1976"), ValueError, "formula: '1976' is none of"),
+        (lambda: ANY.density(ONES, "User"), ValueError, "standard: 'User' is none of DIN"),
+        (lambda: aldermoor.reconstruct(LAB, "CIELCh"), ValueError, "source: 'CIELCh' is none of"),
+        (lambda: aldermoor.Document()["x"], aldermoor.NotFoundError, "SampleSet/x"),
+        (
+            lambda: aldermoor.Document().add_set("s").add_sample("e").spectrum,
+            aldermoor.NotFoundError,
+            "'e' has no spectrum",
+        ),
+        (
+            lambda: aldermoor.Document().add_set("s").add_sample("e").add_spectrum([1, 2]),
+            aldermoor.MissingConditionError,
+            "Physical.WavelengthSpectrumM",
+        ),
+    ],
+)
+def test_what_is_wrong_is_told(
+    call: Callable[[], object], kind: type[Exception], text: str
+) -> None:
+    with pytest.raises(kind, match=text):
+        call()
+
+
+def test_a_text_that_is_no_xml_has_a_place() -> None:
+    path = DATA / "illegal" / "tag_mismatch.xml"
+    with pytest.raises(aldermoor.ParseError, match="unterminated end tag 'Name'") as caught:
+        aldermoor.load(path)
+    assert (caught.value.file, caught.value.line) == (str(path), 3)
+    assert caught.value.trace and all("/src/aldermoor/" in place for place in caught.value.trace)
+
+
+@pytest.mark.parametrize("name", sorted(path.name for path in (DATA / "illegal").glob("*.xml")))
+def test_no_illegal_document_is_read(name: str) -> None:
+    with pytest.raises(aldermoor.ParseError):
+        aldermoor.load(DATA / "illegal" / name)
+
+
+def test_files_that_cannot_be_used_have_an_error_of_the_system(tmp_path: Path) -> None:
+    attempts: list[Callable[[], object]] = [
+        lambda: aldermoor.load(tmp_path / "none.xml"),
+        lambda: aldermoor.load(tmp_path / "none" / "none.xml"),
+        lambda: aldermoor.Document().save(tmp_path / "none" / "x.xml"),
+    ]
+    for attempt in attempts:
+        with pytest.raises(OSError, match="none") as caught:
+            attempt()
+        assert isinstance(caught.value, aldermoor.FileError)
+        assert caught.value.trace
