@@ -4,7 +4,6 @@
 #include <string>
 #include <vector>
 
-#include <CLI/CLI.hpp>
 #include <fmt/format.h>
 
 #include "aldermoor/vexdoc/colorvector.h"
