@@ -66,7 +66,8 @@ struct Request {
   HXMeasureConditions target_typed = Vexdoc::ToMeasureConditions(target);
   HXSpectrum measured{spectrum.GetData(), own_typed};
   Tristim::HXColorVector computed = TristimService::GetVector(measured, target_typed);
-  Conditions result_conditions = Vexdoc::ToConditions(computed.GetMeasureConditions());
+  HXMeasureConditions::KeyedWords result_words =
+      computed.GetMeasureConditions().GetMeasureConditions();
   std::vector<float> result_values{computed[0], computed[1], computed[2]};
 
   Request() { sample.AddElement(SharedSpectrum()); }
@@ -128,11 +129,11 @@ constexpr std::array<Step, 10> kSteps = {{
      }},
     {"  of it conditions of the result to words",
      [](Request& r) {
-       DoNotOptimize(Vexdoc::ToConditions(r.computed.GetMeasureConditions()));
+       DoNotOptimize(r.computed.GetMeasureConditions().GetMeasureConditions());
      }},
     {"  of it the block of these conditions",
      [](Request& r) {
-       DoNotOptimize(ConditionManager::GetInstance().GetOrCreateConditions(r.result_conditions));
+       DoNotOptimize(ConditionManager::GetInstance().FindConditions(r.result_words));
      }},
     {"  of it an attribute's header with its times",
      [](Request&) {

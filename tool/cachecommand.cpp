@@ -8,7 +8,6 @@
 #include <thread>
 #include <vector>
 
-#include <CLI/CLI.hpp>
 #include <fmt/format.h>
 #include <sys/stat.h>
 
@@ -18,6 +17,7 @@
 
 #include "command.h"
 #include "diagnostics.h"
+#include "options.h"
 #include "output.h"
 #include "text.h"
 #include "xmldocument.h"
@@ -130,13 +130,12 @@ std::string Rebuild(const std::string& path) {
 class CacheCommand : public Command {
  public:
   void AddOptions(CLI::App& app) override {
-    app.add_option("FILE", paths_, "XML files")->required()->type_name("");
-    CLI::Option* const show = app.add_flag(
-        "--show", show_, "Tell where the caches are and whether the next load uses them (default)");
-    CLI::Option* const rebuild =
-        app.add_flag("--rebuild", rebuild_, "Write the caches anew from the XML files");
-    app.add_flag("--remove", remove_, "Delete the caches")->excludes(show)->excludes(rebuild);
-    rebuild->excludes(show);
+    AddArguments(app, "FILE", paths_, "XML files");
+    AddExclusiveFlags(app,
+                      {{"--show", show_,
+                        "Tell where the caches are and whether the next load uses them (default)"},
+                       {"--rebuild", rebuild_, "Write the caches anew from the XML files"},
+                       {"--remove", remove_, "Delete the caches"}});
   }
 
   ExitStatus Run() override {

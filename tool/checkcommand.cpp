@@ -6,7 +6,6 @@
 #include <utility>
 #include <vector>
 
-#include <CLI/CLI.hpp>
 #include <fmt/format.h>
 #include <nlohmann/json.hpp>
 

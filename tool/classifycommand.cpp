@@ -2,8 +2,6 @@
 #include <optional>
 #include <string>
 
-#include <CLI/CLI.hpp>
-
 #include "aldermoor/measure/judgement.h"
 #include "aldermoor/vexdoc/conditions.h"
 #include "aldermoor/vexdoc/spectrum.h"
@@ -11,6 +9,7 @@
 #include "coloroptions.h"
 #include "command.h"
 #include "documents.h"
+#include "options.h"
 #include "output.h"
 #include "records.h"
 #include "samplerun.h"
@@ -49,13 +48,11 @@ class ClassifyCommand : public Command {
  public:
   void AddOptions(CLI::App& app) override {
     inputs_.AddTo(app);
-    app.add_option("--illuminant", illuminant_,
-                   "Illuminant in place of that of the sample's conditions: " + IlluminantHelp())
-        ->type_name("WORD");
-    app.add_option("--observer", observer_,
-                   "Observer in place of that of the sample's conditions: " +
-                       std::string(*WordsFor(kObserverKey)))
-        ->type_name("WORD");
+    AddOption(app, "--illuminant", illuminant_, "WORD",
+              "Illuminant in place of that of the sample's conditions: " + IlluminantHelp());
+    AddOption(app, "--observer", observer_, "WORD",
+              "Observer in place of that of the sample's conditions: " +
+                  std::string(*WordsFor(kObserverKey)));
     filter_.AddTo(app);
     output_.AddTo(app, "table csv json");
   }

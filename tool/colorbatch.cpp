@@ -79,6 +79,9 @@ void ColorBatch::Add(const Place& place, const Vexdoc::Sample& sample) {
 
 void ColorBatch::Compute() {
   for (const Kind* const kind : {&reflecting_, &emitting_}) {
+    if (kind->rows.empty()) {
+      continue;  // perhaps without a context
+    }
     std::vector<float> colors(kind->rows.size() * channels_);
     InParallel(jobs_, kind->rows.size(), [&](std::size_t first, std::size_t count) {
       kind->context->ConvertSpectra(

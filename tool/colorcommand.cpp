@@ -4,8 +4,6 @@
 #include <string>
 #include <vector>
 
-#include <CLI/CLI.hpp>
-
 #include "aldermoor/vexdoc/colorvector.h"
 #include "aldermoor/vexdoc/sample.h"
 

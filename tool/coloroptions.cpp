@@ -1,11 +1,11 @@
 #include "coloroptions.h"
 
-#include <CLI/CLI.hpp>
 #include <fmt/format.h>
 #include <fmt/ranges.h>
 
 #include "exitstatus.h"
 #include "illuminant.h"
+#include "options.h"
 #include "vocabulary.h"
 
 namespace Aldermoor::Tool {
@@ -48,26 +48,17 @@ std::string IlluminantHelp() {
 }
 
 void ColorOptions::AddTo(CLI::App& app) {
-  app.add_option("--space", space, "Colour space: " + Words(kTypeKey))
-      ->type_name("WORD")
-      ->capture_default_str();
+  AddOption(app, "--space", space, "WORD", "Colour space: " + Words(kTypeKey));
   AddViewingTo(app);
-  app.add_option("--white-base", white_base, "White base: " + Words(kWhiteBaseKey))
-      ->type_name("WORD");
-  app.add_option("--condition", conditions,
-                 "Further condition as KEY=VALUE; may be repeated.  A key outside the vocabulary "
-                 "needs CustomCondition=Enable in front of it")
-      ->type_name("KEY=VALUE")
-      ->allow_extra_args(false);
+  AddOption(app, "--white-base", white_base, "WORD", "White base: " + Words(kWhiteBaseKey));
+  AddOption(app, "--condition", conditions, "KEY=VALUE",
+            "Further condition as KEY=VALUE; may be repeated.  A key outside the vocabulary "
+            "needs CustomCondition=Enable in front of it");
 }
 
 void ColorOptions::AddViewingTo(CLI::App& app) {
-  app.add_option("--illuminant", illuminant, "Illuminant: " + IlluminantHelp())
-      ->type_name("WORD")
-      ->capture_default_str();
-  app.add_option("--observer", observer, "Observer: " + Words(kObserverKey))
-      ->type_name("WORD")
-      ->capture_default_str();
+  AddOption(app, "--illuminant", illuminant, "WORD", "Illuminant: " + IlluminantHelp());
+  AddOption(app, "--observer", observer, "WORD", "Observer: " + Words(kObserverKey));
 }
 
 Vexdoc::Conditions ColorOptions::MakeConditions() const {

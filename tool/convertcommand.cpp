@@ -2,7 +2,6 @@
 #include <memory>
 #include <string>
 
-#include <CLI/CLI.hpp>
 #include <fmt/format.h>
 
 #include "command.h"
@@ -10,6 +9,7 @@
 #include "csvdocument.h"
 #include "diagnostics.h"
 #include "inputfile.h"
+#include "options.h"
 #include "output.h"
 #include "vocabulary.h"
 #include "xmldocument.h"
@@ -32,23 +32,20 @@ bool IsCsv(const std::string& path, const std::string& option, const std::string
 class ConvertCommand : public Command {
  public:
   void AddOptions(CLI::App& app) override {
-    app.add_option("IN", input_, "What to read; - is standard input")->required()->type_name("");
-    app.add_option("OUT", output_, "What to write; - is standard output")
-        ->required()
-        ->type_name("");
-    app.add_option("--from", from_, "Form of IN, if its name does not end in .csv or .xml: xml csv")
-        ->type_name("WORD");
-    app.add_option("--to", to_, "Form of OUT, likewise")->type_name("WORD");
-    app.add_flag("--no-cache", no_cache_, "Leave the cache beside an XML file as it is");
+    AddArgument(app, "IN", input_, "What to read; - is standard input");
+    AddArgument(app, "OUT", output_, "What to write; - is standard output");
+    AddOption(app, "--from", from_, "WORD",
+              "Form of IN, if its name does not end in .csv or .xml: xml csv");
+    AddOption(app, "--to", to_, "WORD", "Form of OUT, likewise");
+    AddFlag(app, "--no-cache", no_cache_, "Leave the cache beside an XML file as it is");
     csv_.conditions.AddTo(app);
-    app.add_option("--separator", separator_, "Between the cells of CSV: comma semicolon tab")
-        ->type_name("WORD")
-        ->capture_default_str();
-    app.add_flag("--percent", csv_.percent, "The spectra of the CSV file are in percent");
-    app.add_option("--set", csv_.set, "Name of the set for a CSV file that does not name one")
-        ->type_name("NAME");
-    app.add_flag("--skip-faulty", csv_.skip_faulty,
-                 "Leave out rows with faults, and what CSV cannot carry");
+    AddOption(app, "--separator", separator_, "WORD",
+              "Between the cells of CSV: comma semicolon tab");
+    AddFlag(app, "--percent", csv_.percent, "The spectra of the CSV file are in percent");
+    AddOption(app, "--set", csv_.set, "NAME",
+              "Name of the set for a CSV file that does not name one");
+    AddFlag(app, "--skip-faulty", csv_.skip_faulty,
+            "Leave out rows with faults, and what CSV cannot carry");
   }
 
   ExitStatus Run() override {

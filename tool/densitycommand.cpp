@@ -9,7 +9,6 @@
 #include <utility>
 #include <vector>
 
-#include <CLI/CLI.hpp>
 #include <fmt/format.h>
 
 #include "aldermoor/measure/density.h"
@@ -20,6 +19,7 @@
 #include "command.h"
 #include "documents.h"
 #include "illuminant.h"
+#include "options.h"
 #include "output.h"
 #include "records.h"
 #include "samplerun.h"
@@ -207,21 +207,15 @@ class DensityCommand : public Command {
  public:
   void AddOptions(CLI::App& app) override {
     inputs_.AddTo(app);
-    app.add_option("--standard", request_.standard_word, fmt::format("Standard: {}", kStandards))
-        ->type_name("WORD")
-        ->capture_default_str();
-    app.add_option("--filter", request_.mode_word,
-                   "Channel that is reported: " + std::string(*WordsFor(kModeKey)))
-        ->type_name("WORD")
-        ->capture_default_str();
+    AddOption(app, "--standard", request_.standard_word, "WORD",
+              fmt::format("Standard: {}", kStandards));
+    AddOption(app, "--filter", request_.mode_word, "WORD",
+              "Channel that is reported: " + std::string(*WordsFor(kModeKey)));
     AddPath(app, "--paper", paper_, "Paper, to which densities are then relative");
-    app.add_flag("--absolute", request_.absolute, "Leave densities absolute in spite of --paper");
-    app.add_option("--solid", solids_,
-                   "Solid, for dot area and contrast; may be repeated, one for each channel")
-        ->type_name("SET/SAMPLE")
-        ->allow_extra_args(false);
-    app.add_option("--yule-nielsen", yule_nielsen_, "Yule-Nielsen factor of the dot area")
-        ->type_name("N");
+    AddFlag(app, "--absolute", request_.absolute, "Leave densities absolute in spite of --paper");
+    AddOption(app, "--solid", solids_, "SET/SAMPLE",
+              "Solid, for dot area and contrast; may be repeated, one for each channel");
+    AddOption(app, "--yule-nielsen", yule_nielsen_, "N", "Yule-Nielsen factor of the dot area");
     AddPath(app, "--first", first_, "For trapping: the solid that is printed first");
     AddPath(app, "--second", second_, "For trapping: the solid that is printed on it");
     AddPath(app, "--overprint", overprint_, "For trapping: the field with both");
@@ -258,7 +252,7 @@ class DensityCommand : public Command {
 
   static void AddPath(CLI::App& app, const char* option, std::optional<std::string>& path,
                       const char* help) {
-    app.add_option(option, path, help)->type_name("SET/SAMPLE");
+    AddOption(app, option, path, "SET/SAMPLE", help);
   }
 
   static std::optional<SpectrumPath> PathOf(const std::string& option,

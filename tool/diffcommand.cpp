@@ -12,7 +12,6 @@
 #include <utility>
 #include <vector>
 
-#include <CLI/CLI.hpp>
 #include <fmt/format.h>
 
 #include "aldermoor/vexdoc/conditions.h"
@@ -22,6 +21,7 @@
 #include "comparison.h"
 #include "documents.h"
 #include "jobs.h"
+#include "options.h"
 #include "output.h"
 #include "records.h"
 #include "samplepairs.h"
@@ -160,19 +160,13 @@ class DiffReport {
 class DiffCommand : public Command {
  public:
   void AddOptions(CLI::App& app) override {
-    app.add_option("REFERENCE", reference_, "Document to compare with; - is standard input")
-        ->required()
-        ->type_name("");
-    app.add_option("SAMPLE", inputs_.paths, "Documents to compare")->required()->type_name("");
-    app.add_option("--formula", formula_,
-                   "Difference formula: " + std::string(*WordsFor(kFormulaKey)))
-        ->type_name("WORD")
-        ->capture_default_str();
-    app.add_option("--weights", weights_, "Weights: kL,kC,kH of 94 and 2000, l,c of CMC")
-        ->type_name("N,...");
-    app.add_option("--limit", limit_, "Tell which files have no difference above this")
-        ->type_name("N");
-    app.add_flag("--summary", only_summary_, "Leave out the single differences");
+    AddArgument(app, "REFERENCE", reference_, "Document to compare with; - is standard input");
+    AddArguments(app, "SAMPLE", inputs_.paths, "Documents to compare");
+    AddOption(app, "--formula", formula_, "WORD",
+              "Difference formula: " + std::string(*WordsFor(kFormulaKey)));
+    AddOption(app, "--weights", weights_, "N,...", "Weights: kL,kC,kH of 94 and 2000, l,c of CMC");
+    AddOption(app, "--limit", limit_, "N", "Tell which files have no difference above this");
+    AddFlag(app, "--summary", only_summary_, "Leave out the single differences");
     color_.AddViewingTo(app);
     filter_.AddTo(app);
     jobs_.AddTo(app);

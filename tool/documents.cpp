@@ -7,7 +7,6 @@
 #include <sstream>
 #include <system_error>
 
-#include <CLI/CLI.hpp>
 #include <fmt/format.h>
 
 #include "aldermoor/utilities/filesystem/file.h"
@@ -17,6 +16,7 @@
 
 #include "diagnostics.h"
 #include "inputfile.h"
+#include "options.h"
 #include "output.h"
 
 namespace Aldermoor::Tool {
@@ -68,9 +68,7 @@ void LoadDocument(const std::string& path, Vexdoc::VEX& document) {
 }
 
 void InputOptions::AddTo(CLI::App& app) {
-  app.add_option("FILE", paths, "Documents to read; - is standard input")
-      ->required()
-      ->type_name("");
+  AddArguments(app, "FILE", paths, "Documents to read; - is standard input");
 }
 
 bool InputOptions::TryLoad(const std::string& path, Vexdoc::VEX& document) {
@@ -92,8 +90,8 @@ void InputOptions::CheckStandardInput(const std::string& other) const {
 }
 
 void SampleFilter::AddTo(CLI::App& app) {
-  app.add_option("--set", set, "Only the sample set of this name")->type_name("NAME");
-  app.add_option("--sample", sample, "Only samples of this name")->type_name("NAME");
+  AddOption(app, "--set", set, "NAME", "Only the sample set of this name");
+  AddOption(app, "--sample", sample, "NAME", "Only samples of this name");
 }
 
 std::string SampleFilter::NoMatchText() const {

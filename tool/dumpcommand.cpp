@@ -7,12 +7,11 @@
 #include <string>
 #include <string_view>
 
-#include <CLI/CLI.hpp>
-
 #include "aldermoor/vexdoc/inspection.h"
 
 #include "command.h"
 #include "inputfile.h"
+#include "options.h"
 #include "output.h"
 
 namespace Aldermoor::Tool {
@@ -53,11 +52,8 @@ class OutputBuffer : public std::streambuf {
 class DumpCommand : public Command {
  public:
   void AddOptions(CLI::App& app) override {
-    app.add_option("FILE", path_, "The cache to show; - is standard input")
-        ->required()
-        ->type_name("");
-    app.add_option("-o,--output", target_, "Where the result goes; - is standard output")
-        ->type_name("FILE");
+    AddArgument(app, "FILE", path_, "The cache to show; - is standard input");
+    AddOutputOption(app, target_, "Where the result goes; - is standard output");
   }
 
   ExitStatus Run() override {

@@ -2,13 +2,13 @@
 #include <memory>
 #include <string>
 
-#include <CLI/CLI.hpp>
 #include <fmt/format.h>
 
 #include "command.h"
 #include "diagnostics.h"
 #include "documents.h"
 #include "inputfile.h"
+#include "options.h"
 #include "output.h"
 #include "xmldocument.h"
 
@@ -32,14 +32,10 @@ void KeepOnly(Node& node, Takes takes) {
 class ExtractCommand : public Command {
  public:
   void AddOptions(CLI::App& app) override {
-    app.add_option("FILE", input_, "Document to read; - is standard input")
-        ->required()
-        ->type_name("");
+    AddArgument(app, "FILE", input_, "Document to read; - is standard input");
     filter_.AddTo(app);
-    app.add_option("-o,--output", output_, "What to write; - is standard output")
-        ->required()
-        ->type_name("FILE");
-    app.add_flag("--no-cache", no_cache_, "Leave the cache beside the file as it is");
+    AddRequiredOutputOption(app, output_);
+    AddFlag(app, "--no-cache", no_cache_, "Leave the cache beside the file as it is");
   }
 
   ExitStatus Run() override {

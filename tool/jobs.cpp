@@ -5,14 +5,12 @@
 #include <thread>
 #include <vector>
 
-#include <CLI/CLI.hpp>
+#include "options.h"
 
 namespace Aldermoor::Tool {
 
 void JobOptions::AddTo(CLI::App& app) {
-  app.add_option("--jobs", jobs, "Threads that compute; 0 takes as many as the machine runs")
-      ->type_name("N")
-      ->capture_default_str();
+  AddOption(app, "--jobs", jobs, "N", "Threads that compute; 0 takes as many as the machine runs");
 }
 
 void InParallel(const JobOptions& options, std::size_t rows,

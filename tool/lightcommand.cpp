@@ -6,8 +6,6 @@
 #include <string>
 #include <string_view>
 
-#include <CLI/CLI.hpp>
-
 #include "aldermoor/measure/light.h"
 #include "aldermoor/vexdoc/colorvector.h"
 #include "aldermoor/vexdoc/conditions.h"

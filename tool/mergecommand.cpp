@@ -3,7 +3,6 @@
 #include <string>
 #include <vector>
 
-#include <CLI/CLI.hpp>
 #include <fmt/format.h>
 #include <fmt/ranges.h>
 
@@ -11,6 +10,7 @@
 #include "diagnostics.h"
 #include "documents.h"
 #include "inputfile.h"
+#include "options.h"
 #include "output.h"
 #include "xmldocument.h"
 
@@ -38,10 +38,8 @@ class MergeCommand : public Command {
  public:
   void AddOptions(CLI::App& app) override {
     inputs_.AddTo(app);
-    app.add_option("-o,--output", output_, "What to write; - is standard output")
-        ->required()
-        ->type_name("FILE");
-    app.add_flag("--no-cache", no_cache_, "Leave the cache beside the file as it is");
+    AddRequiredOutputOption(app, output_);
+    AddFlag(app, "--no-cache", no_cache_, "Leave the cache beside the file as it is");
   }
 
   ExitStatus Run() override {

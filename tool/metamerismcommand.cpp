@@ -3,8 +3,6 @@
 #include <string_view>
 #include <vector>
 
-#include <CLI/CLI.hpp>
-
 #include "aldermoor/measure/judgement.h"
 #include "aldermoor/vexdoc/conditions.h"
 #include "aldermoor/vexdoc/spectrum.h"
@@ -13,6 +11,7 @@
 #include "command.h"
 #include "documents.h"
 #include "illuminant.h"
+#include "options.h"
 #include "output.h"
 #include "records.h"
 #include "samplepairs.h"
@@ -32,21 +31,14 @@ struct TestLight {
 class MetamerismCommand : public Command {
  public:
   void AddOptions(CLI::App& app) override {
-    app.add_option("A", first_, "Document of the first samples; - is standard input")
-        ->required()
-        ->type_name("");
-    app.add_option("B", second_, "Document of the second samples")->required()->type_name("");
-    app.add_option("--reference", reference_,
-                   "Illuminant under which the pairs match: " + IlluminantHelp())
-        ->type_name("WORD")
-        ->capture_default_str();
-    app.add_option("--test", tests_,
-                   "Named illuminants under which they may not, with commas between them")
-        ->type_name("WORD,...")
-        ->capture_default_str();
-    app.add_option("--observer", observer_, "Observer: " + std::string(*WordsFor(kObserverKey)))
-        ->type_name("WORD")
-        ->capture_default_str();
+    AddArgument(app, "A", first_, "Document of the first samples; - is standard input");
+    AddArgument(app, "B", second_, "Document of the second samples");
+    AddOption(app, "--reference", reference_, "WORD",
+              "Illuminant under which the pairs match: " + IlluminantHelp());
+    AddOption(app, "--test", tests_, "WORD,...",
+              "Named illuminants under which they may not, with commas between them");
+    AddOption(app, "--observer", observer_, "WORD",
+              "Observer: " + std::string(*WordsFor(kObserverKey)));
     filter_.AddTo(app);
     output_.AddTo(app, "table csv json");
   }

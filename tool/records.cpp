@@ -4,10 +4,10 @@
 #include <cstddef>
 #include <utility>
 
-#include <CLI/CLI.hpp>
 #include <fmt/format.h>
 
 #include "exitstatus.h"
+#include "options.h"
 #include "text.h"
 #include "vocabulary.h"
 
@@ -213,11 +213,8 @@ class TableWriter : public RecordWriter {
 
 void OutputOptions::AddTo(CLI::App& app, const std::string& formats) {
   formats_ = formats;
-  app.add_option("--format", format, "How to write the results: " + formats)
-      ->type_name("WORD")
-      ->capture_default_str();
-  app.add_option("-o,--output", path, "Write to this file instead of standard output (-)")
-      ->type_name("FILE");
+  AddOption(app, "--format", format, "WORD", "How to write the results: " + formats);
+  AddOutputOption(app, path, "Write to this file instead of standard output (-)");
 }
 
 Format OutputOptions::GetFormat() const {

@@ -5,12 +5,12 @@
 #include <system_error>
 #include <vector>
 
-#include <CLI/CLI.hpp>
 #include <fmt/format.h>
 #include <fmt/ranges.h>
 
 #include "diagnostics.h"
 #include "exitstatus.h"
+#include "options.h"
 #include "vocabulary.h"
 
 namespace Aldermoor::Tool {
@@ -119,11 +119,9 @@ void KindConditions::AddAnyText(const std::string& what, const std::string& key,
 }
 
 void ConditionOption::AddTo(CLI::App& app) {
-  app.add_option("--condition", texts,
-                 "Condition as KEY=VALUE, for what the input does not give; may be repeated.  "
-                 "Spectrum.KEY=VALUE and Color.KEY=VALUE take any key and text")
-      ->type_name("KEY=VALUE")
-      ->allow_extra_args(false);
+  AddOption(app, "--condition", texts, "KEY=VALUE",
+            "Condition as KEY=VALUE, for what the input does not give; may be repeated.  "
+            "Spectrum.KEY=VALUE and Color.KEY=VALUE take any key and text");
 }
 
 void ConditionOption::ApplyTo(KindConditions& conditions) const {

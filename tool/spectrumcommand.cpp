@@ -9,7 +9,6 @@
 #include <utility>
 #include <vector>
 
-#include <CLI/CLI.hpp>
 #include <fmt/format.h>
 
 #include "aldermoor/measure/judgement.h"
@@ -22,6 +21,7 @@
 #include "command.h"
 #include "diagnostics.h"
 #include "documents.h"
+#include "options.h"
 #include "output.h"
 #include "records.h"
 #include "requestedcolor.h"
@@ -95,15 +95,12 @@ void WriteDocument(Output& output, const std::vector<Found>& all) {
 class SpectrumCommand : public Command {
  public:
   void AddOptions(CLI::App& app) override {
-    app.add_option("COLOUR", colors_, "Channel values with commas between them, such as 50,20,10")
-        ->type_name("");
-    app.add_option("--input", input_, "Take the colours of the samples of this document")
-        ->type_name("FILE");
-    app.add_option("--space", color_.space, fmt::format("Colour space: {}", kSpaces))
-        ->type_name("WORD")
-        ->capture_default_str();
+    AddOptionalArguments(app, "COLOUR", colors_,
+                         "Channel values with commas between them, such as 50,20,10");
+    AddOption(app, "--input", input_, "FILE", "Take the colours of the samples of this document");
+    AddOption(app, "--space", color_.space, "WORD", fmt::format("Colour space: {}", kSpaces));
     color_.AddViewingTo(app);
-    app.add_option("--save", save_, "Write the spectra as a document too")->type_name("FILE");
+    AddOption(app, "--save", save_, "FILE", "Write the spectra as a document too");
     filter_.AddTo(app);
     output_.AddTo(app, "table csv json");
   }

@@ -175,5 +175,24 @@ TEST(ColorimetryBridgeTest, ConditionsComeBackWithoutWhatIsUndefined) {
   EXPECT_EQ(round(source).GetCustomIllumination().GetData(), Values(36, 3.0F));
 }
 
+TEST(ColorimetryBridgeTest, AVectorGetsTheBlockOfItsConditions) {
+  Conditions custom = With({{kIlluminationKey, "Userdefined"}});
+  custom.SetCustomIllumination(Flat(2));
+  Conditions other_curve = custom;
+  other_curve.SetCustomIllumination(Flat(3));
+  for (const Conditions& source :
+       {With({}), With({{"Physical.Filter", "Undefined"}}), custom, other_curve}) {
+    const Tristim::HXMeasureConditions typed = ToMeasureConditions(source);
+    const Conditions expected = ToConditions(typed);
+    Conditions with_a_curve = expected;  // a block that differs in the curve only
+    with_a_curve.SetCustomIllumination(Flat(1));
+    const ColorVector decoy(with_a_curve, Values(3));
+    const auto first = ToColorVector({1, 2, 3, typed});
+    EXPECT_TRUE(*first->GetConditions() == expected);
+    EXPECT_TRUE(IsSame(ToColorVector({1, 2, 3, typed})->GetConditions(), first->GetConditions()));
+    EXPECT_TRUE(IsSame(ColorVector(expected, Values(3)).GetConditions(), first->GetConditions()));
+  }
+}
+
 }  // namespace
 }  // namespace Aldermoor::Vexdoc::Tests

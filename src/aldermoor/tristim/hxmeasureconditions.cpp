@@ -1,5 +1,6 @@
 #include "aldermoor/tristim/hxmeasureconditions.h"
 
+#include <algorithm>
 #include <memory>
 
 #include "aldermoor/tristim/hxspectrum.h"
@@ -23,6 +24,9 @@ struct HXMeasureConditions::Key {
   std::string_view name;
   void (*write)(HXMeasureConditions& conditions, const std::string& value);
   std::string (*read)(const HXMeasureConditions& conditions);
+
+  /// In ascending order of their names.
+  static const std::array<Key, kKeyCount> kAll;
 
   template <auto kMember, auto kParse>
   static void Write(HXMeasureConditions& conditions, const std::string& value) {
@@ -51,37 +55,33 @@ struct HXMeasureConditions::Key {
   }
 };
 
-const HXMeasureConditions::Key* HXMeasureConditions::FindKey(std::string_view name) {
-  using C = HXMeasureConditions;
-  using T = MeasureConditionTranslator;
-  static constexpr Key kKeys[] = {
-      {Words::kColorSpaceKey, Key::Write<&C::color_space_, &T::GetColorSpace>,
-       Key::Text<&C::color_space_>},
-      {Words::kIlluminationKey, Key::WriteIllumination, Key::Word<&C::illumination_>},
-      {Words::kObserverKey, Key::Write<&C::observer_, &T::GetObserver>, Key::Word<&C::observer_>},
-      {Words::kWhiteBaseKey, Key::Write<&C::white_base_, &T::GetWhiteBase>,
-       Key::Word<&C::white_base_>},
-      {Words::kFilterKey, Key::Write<&C::physical_filter_, &T::GetPhysicalFilter>,
-       Key::Word<&C::physical_filter_>},
-      {Words::kDensityStandardKey, Key::Write<&C::density_standard_, &T::GetDensityStandard>,
-       Key::Word<&C::density_standard_>},
-      {Words::kDensityFilterModeKey, Key::Write<&C::density_filter_mode_, &T::GetDensityFilterMode>,
-       Key::Word<&C::density_filter_mode_>},
-      {Words::kVectorKindKey, Key::Write<&C::vector_kind_, &T::GetRelativeOrAbsoluteVector>,
-       Key::Text<&C::vector_kind_>},
-      {Words::kDeltaEFormulaKey, Key::Write<&C::delta_e_formula_, &T::GetDeltaEFormula>,
-       Key::Text<&C::delta_e_formula_>},
-      {Words::kSpectrumTypeKey, Key::Store<&C::spectrum_type_>, Key::Text<&C::spectrum_type_>},
-      {Words::kNumberOfDataPointsKey, Key::Ignore, Key::Constant<Words::kNumberOfDataPoints>},
-      {Words::kWavelengthMaxKey, Key::Ignore, Key::Constant<Words::kWavelengthMax>},
-      {Words::kWavelengthMinKey, Key::Ignore, Key::Constant<Words::kWavelengthMin>},
-  };
-  for (const Key& key : kKeys) {
-    if (key.name == name) {
-      return &key;
-    }
-  }
-  return nullptr;
+using C = HXMeasureConditions;
+using T = MeasureConditionTranslator;
+
+constexpr std::array<C::Key, C::kKeyCount> C::Key::kAll = {{
+    {Words::kVectorKindKey, Write<&C::vector_kind_, &T::GetRelativeOrAbsoluteVector>,
+     Text<&C::vector_kind_>},
+    {Words::kDeltaEFormulaKey, Write<&C::delta_e_formula_, &T::GetDeltaEFormula>,
+     Text<&C::delta_e_formula_>},
+    {Words::kColorSpaceKey, Write<&C::color_space_, &T::GetColorSpace>, Text<&C::color_space_>},
+    {Words::kDensityFilterModeKey, Write<&C::density_filter_mode_, &T::GetDensityFilterMode>,
+     Word<&C::density_filter_mode_>},
+    {Words::kDensityStandardKey, Write<&C::density_standard_, &T::GetDensityStandard>,
+     Word<&C::density_standard_>},
+    {Words::kIlluminationKey, WriteIllumination, Word<&C::illumination_>},
+    {Words::kObserverKey, Write<&C::observer_, &T::GetObserver>, Word<&C::observer_>},
+    {Words::kWhiteBaseKey, Write<&C::white_base_, &T::GetWhiteBase>, Word<&C::white_base_>},
+    {Words::kFilterKey, Write<&C::physical_filter_, &T::GetPhysicalFilter>,
+     Word<&C::physical_filter_>},
+    {Words::kNumberOfDataPointsKey, Ignore, Constant<Words::kNumberOfDataPoints>},
+    {Words::kSpectrumTypeKey, Store<&C::spectrum_type_>, Text<&C::spectrum_type_>},
+    {Words::kWavelengthMaxKey, Ignore, Constant<Words::kWavelengthMax>},
+    {Words::kWavelengthMinKey, Ignore, Constant<Words::kWavelengthMin>},
+}};
+
+const C::Key* C::FindKey(std::string_view name) {
+  const auto* const found = std::ranges::find(Key::kAll, name, &Key::name);
+  return found == Key::kAll.end() ? nullptr : found;
 }
 
 HXMeasureConditions::HXMeasureConditions() try
@@ -144,6 +144,15 @@ std::string HXMeasureConditions::GetMeasureCondition(std::string_view key) const
   return Words::kUndefined;
 }
 ALDERMOOR_FRAME(Aldermoor::Tristim::HXMeasureConditions::GetMeasureCondition)
+
+HXMeasureConditions::KeyedWords HXMeasureConditions::GetMeasureConditions() const try {
+  static_assert(std::ranges::is_sorted(Key::kAll, {}, &Key::name));
+  KeyedWords words;
+  std::ranges::transform(Key::kAll, words.begin(),
+                         [this](const Key& key) { return std::pair(key.name, key.read(*this)); });
+  return words;
+}
+ALDERMOOR_FRAME(Aldermoor::Tristim::HXMeasureConditions::GetMeasureConditions)
 
 const std::vector<std::string>& HXMeasureConditions::GetSupportedValues(std::string_view key) try {
   return Internals::Initialisator::Get().GetSupportedValues(key);

@@ -1,10 +1,13 @@
 #ifndef ALDERMOOR_TRISTIM_HXMEASURECONDITIONS_H
 #define ALDERMOOR_TRISTIM_HXMEASURECONDITIONS_H
 
+#include <array>
+#include <cstddef>
 #include <cstdint>
 #include <map>
 #include <string>
 #include <string_view>
+#include <utility>
 #include <vector>
 
 #include "aldermoor/tristim/internals/hxillumination.h"
@@ -65,6 +68,9 @@ enum class DensityFilterMode : std::int32_t {
 /// Shared state: the table of supported values, which the first object builds.
 class HXMeasureConditions : public Internals::GlobalStringInitialisator {
  public:
+  static constexpr std::size_t kKeyCount = 13;
+  using KeyedWords = std::array<std::pair<std::string_view, std::string>, kKeyCount>;
+
   HXMeasureConditions();
   HXMeasureConditions(const HXMeasureConditions& other);
   HXMeasureConditions& operator=(const HXMeasureConditions& other);
@@ -81,6 +87,8 @@ class HXMeasureConditions : public Internals::GlobalStringInitialisator {
   void SetMeasureConditions(const std::map<std::string, std::string>& conditions);
   /// The word of a condition; "Undefined" for a key without a value, which is no failure.
   [[nodiscard]] std::string GetMeasureCondition(std::string_view key) const;
+  /// The keys of the vocabulary in ascending order, each with its word.
+  [[nodiscard]] KeyedWords GetMeasureConditions() const;
 
   /// The words that `key` can take, or the channel labels of a colour space.  An unknown key gives
   /// an empty list.

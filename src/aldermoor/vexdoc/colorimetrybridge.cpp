@@ -1,6 +1,6 @@
 #include "aldermoor/vexdoc/colorimetrybridge.h"
 
-#include <array>
+#include <algorithm>
 #include <stdexcept>
 #include <string>
 #include <vector>
@@ -13,9 +13,11 @@
 #include "aldermoor/tristim/tristimservice.h"
 #include "aldermoor/utilities/exceptions/exceptions.h"
 #include "aldermoor/utilities/exceptions/frame.h"
+#include "aldermoor/vexdoc/internals/conditionmanager.h"
 
 namespace Aldermoor::Vexdoc {
 
+using Internals::ConditionManager;
 using Tristim::HXColorVector;
 using Tristim::HXMeasureConditions;
 using Tristim::HXSpectrum;
@@ -26,28 +28,27 @@ using Utilities::Tools::SmartPointer;
 
 namespace {
 
+namespace IlluminationType = Tristim::IlluminationType;
 using Tristim::Vocabulary::kUndefined;
 using Tristim::Vocabulary::kUserdefined;
 
 const std::string kIlluminationKey = Tristim::Vocabulary::kIlluminationKey;
 const std::string kColorSpaceKey = Tristim::Vocabulary::kColorSpaceKey;
 
-// What a computed attribute says about itself.
-const std::array<std::string, 13> kCarriedKeys = {
-    Tristim::Vocabulary::kFilterKey,
-    Tristim::Vocabulary::kNumberOfDataPointsKey,
-    Tristim::Vocabulary::kWavelengthMinKey,
-    Tristim::Vocabulary::kWavelengthMaxKey,
-    Tristim::Vocabulary::kObserverKey,
-    kIlluminationKey,
-    Tristim::Vocabulary::kWhiteBaseKey,
-    Tristim::Vocabulary::kDensityStandardKey,
-    Tristim::Vocabulary::kDensityFilterModeKey,
-    kColorSpaceKey,
-    Tristim::Vocabulary::kVectorKindKey,
-    Tristim::Vocabulary::kDeltaEFormulaKey,
-    Tristim::Vocabulary::kSpectrumTypeKey,
-};
+// The block that an attribute under ToConditions(conditions) gets.  As a rule it is there already,
+// and is found without the two dozen allocations of a Conditions of its own.
+SmartPointer<Conditions> ToBlock(const HXMeasureConditions& conditions) {
+  ConditionManager& manager = ConditionManager::GetInstance();
+  if (conditions.GetIllumination().GetIlluminationType() != IlluminationType::kUserdefined) {
+    HXMeasureConditions::KeyedWords words = conditions.GetMeasureConditions();
+    const auto defined = std::remove_if(words.begin(), words.end(),
+                                        [](const auto& word) { return word.second == kUndefined; });
+    if (SmartPointer<Conditions> block = manager.FindConditions({words.begin(), defined})) {
+      return block;
+    }
+  }
+  return manager.GetOrCreateConditions(ToConditions(conditions));
+}
 
 SmartPointer<SampleAttribute> Derived(const HXColorVector& vector) {
   SmartPointer<SampleAttribute> result = ToColorVector(vector);
@@ -92,12 +93,11 @@ ALDERMOOR_FRAME(Aldermoor::Vexdoc::ToMeasureConditions)
 
 Conditions ToConditions(const HXMeasureConditions& conditions) try {
   Conditions result;
-  for (const std::string& key : kCarriedKeys) {
-    const std::string value = conditions.GetMeasureCondition(key);
+  for (const auto& [key, value] : conditions.GetMeasureConditions()) {
     if (value == kUndefined) {
       continue;
     }
-    result.AddAttribute(key, value);
+    result.AddAttribute(std::string(key), value);
     if (value == kUserdefined && key == kIlluminationKey) {
       result.SetCustomIllumination(ToSpectrum(conditions.GetUserdefinedIllumination()));
     }
@@ -127,16 +127,14 @@ ALDERMOOR_FRAME(Aldermoor::Vexdoc::ToHXColorVector)
 
 SmartPointer<ColorVector> ToColorVector(const HXColorVector& vector) try {
   const HXMeasureConditions& conditions = vector.GetMeasureConditions();
-  const std::string color_space = conditions.GetMeasureCondition(kColorSpaceKey);
+  const std::string& color_space = conditions.GetColorSpace();
   if (color_space == kUndefined) {
     throw std::invalid_argument("Colorspace missing");
   }
-  const short count = color_space == Tristim::Vocabulary::kCMYK ? 4 : 3;
-  std::vector<float> values;
-  for (short i = 0; i < count; ++i) {
-    values.push_back(vector[i]);
-  }
-  return SmartPointer<ColorVector>(new ColorVector(ToConditions(conditions), values));
+  const int count = color_space == Tristim::Vocabulary::kCMYK ? 4 : 3;
+  const auto* const first = vector.GetChannels().begin();
+  const std::vector<float> values(first, first + count);
+  return SmartPointer<ColorVector>(new ColorVector(*ToBlock(conditions), values));
 }
 ALDERMOOR_FRAME(Aldermoor::Vexdoc::ToColorVector)
 

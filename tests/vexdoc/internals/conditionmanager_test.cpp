@@ -45,12 +45,15 @@ TEST(ConditionManagerTest, EqualConditionsAreOneBlockAndABlockIsFoundUnderItsPre
     EXPECT_TRUE(*block == asked);
     EXPECT_TRUE(IsSame(Manager().GetOrCreateConditions(Conditions("other", asked)), block));
     EXPECT_TRUE(IsSame(Manager().GetConditions(block->GetID()), block));
+    const std::vector<std::pair<std::string_view, std::string>> words = {{"manager", "asked"}};
+    EXPECT_TRUE(IsSame(Manager().FindConditions(words), block));
     for (unsigned i = 0; i < others; ++i) {
       Manager().GetOrCreateConditions(With({{"manager", std::to_string(i).c_str()}}));
     }
     EXPECT_EQ(Manager().GetConditionsCount(), others + 1U);
 
     block->AddAttribute("manager", "changed");
+    EXPECT_TRUE(Manager().FindConditions(words).IsNull());
     EXPECT_TRUE(IsSame(Manager().GetOrCreateConditions(changed), block));
     EXPECT_FALSE(IsSame(Manager().GetOrCreateConditions(asked), block));
     EXPECT_EQ(Manager().GetConditionsCount(), others + 2U);

@@ -1,5 +1,6 @@
 #include "aldermoor/vexdoc/internals/conditionmanager.h"
 
+#include <algorithm>
 #include <functional>
 #include <utility>
 
@@ -17,10 +18,11 @@ namespace {
 // A walk over fewer blocks costs less than a hash of the attributes.
 constexpr std::size_t kFewBlocks = 16;
 
-std::size_t HashOf(const Conditions& conditions) {
+template <class Attributes>
+std::size_t HashOf(const Attributes& attributes) {
   std::size_t hash = 0;
-  for (const auto& [key, value] : conditions.GetAttributes()) {
-    const std::hash<std::string> text;
+  for (const auto& [key, value] : attributes) {
+    const std::hash<std::string_view> text;
     hash = (hash * 31 + text(key)) * 31 + text(value);
   }
   return hash;
@@ -38,7 +40,7 @@ ConditionManager::Block ConditionManager::Store(const Block& block) {
   const auto entry = conditions_.emplace(block->GetID(), block).first;
   if (!is_index_stale_) {
     is_index_stale_ = true;  // should the next line fail
-    index_.emplace(HashOf(*block), entry);
+    index_.emplace(HashOf(block->GetAttributes()), entry);
     is_index_stale_ = false;
   }
   return block;
@@ -61,10 +63,29 @@ ConditionManager::Block ConditionManager::GetOrCreateConditions(Conditions&& con
 }
 ALDERMOOR_FRAME(Aldermoor::Vexdoc::Internals::ConditionManager::GetOrCreateConditions)
 
+ConditionManager::Block ConditionManager::FindConditions(
+    std::span<const std::pair<std::string_view, std::string>> attributes) try {
+  return FindFirst(attributes, [attributes](const Conditions& block) {
+    return !block.HasCustomIllumination() &&
+           std::ranges::equal(block.GetAttributes(), attributes,
+                              [](const auto& own, const auto& wanted) {
+                                return own.first == wanted.first && own.second == wanted.second;
+                              });
+  });
+}
+ALDERMOOR_FRAME(Aldermoor::Vexdoc::Internals::ConditionManager::FindConditions)
+
 ConditionManager::Block ConditionManager::FindEqual(const Conditions& conditions) {
+  return FindFirst(conditions.GetAttributes(),
+                   [&conditions](const Conditions& block) { return block == conditions; });
+}
+
+template <class Attributes, class Predicate>
+ConditionManager::Block ConditionManager::FindFirst(const Attributes& attributes,
+                                                    Predicate is_wanted) {
   if (conditions_.size() <= kFewBlocks) {
     for (const auto& [id, block] : conditions_) {
-      if (*block == conditions) {
+      if (is_wanted(*block)) {
         return block;
       }
     }
@@ -73,11 +94,10 @@ ConditionManager::Block ConditionManager::FindEqual(const Conditions& conditions
   // A file with very many blocks must not cost the square of their number.
   UpdateIndex();
   auto first = conditions_.cend();
-  const auto [begin, end] = index_.equal_range(HashOf(conditions));
+  const auto [begin, end] = index_.equal_range(HashOf(attributes));
   for (auto candidate = begin; candidate != end; ++candidate) {
     const auto entry = candidate->second;
-    if (*entry->second == conditions &&
-        (first == conditions_.cend() || entry->first < first->first)) {
+    if (is_wanted(*entry->second) && (first == conditions_.cend() || entry->first < first->first)) {
       first = entry;
     }
   }
@@ -92,7 +112,7 @@ void ConditionManager::UpdateIndex() {
   is_index_stale_ = true;
   index_.clear();
   for (auto entry = conditions_.cbegin(); entry != conditions_.cend(); ++entry) {
-    index_.emplace(HashOf(*entry->second), entry);
+    index_.emplace(HashOf(entry->second->GetAttributes()), entry);
   }
   indexed_changes_ = Conditions::changes_of_shared_;
   is_index_stale_ = false;

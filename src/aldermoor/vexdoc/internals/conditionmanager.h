@@ -3,8 +3,11 @@
 
 #include <cstddef>
 #include <map>
+#include <span>
 #include <string>
+#include <string_view>
 #include <unordered_map>
+#include <utility>
 
 #include "aldermoor/utilities/patterns/singleton.h"
 #include "aldermoor/utilities/tools/smartpointer.h"
@@ -27,6 +30,9 @@ class ConditionManager final : public Utilities::Patterns::Singleton<ConditionMa
   virtual Block GetOrCreateConditions(const Conditions& conditions);
   /// The same, but a new block takes the content over: one that was read from a file can be big.
   Block GetOrCreateConditions(Conditions&& conditions);
+  /// The first block with exactly these attributes, in ascending order of their keys, and without
+  /// a custom illumination; empty if there is none.
+  Block FindConditions(std::span<const std::pair<std::string_view, std::string>> attributes);
   /// Throws: ResourceNotAvailableException if there is no block of that ID.
   virtual Block GetConditions(const std::string& id);
   /// Stores an empty block under the next ID.
@@ -46,13 +52,15 @@ class ConditionManager final : public Utilities::Patterns::Singleton<ConditionMa
 
   Block Store(const Block& block);
   std::string GetNextUniqueID();
+  template <class Attributes, class Predicate>
+  Block FindFirst(const Attributes& attributes, Predicate is_wanted);
   Block FindEqual(const Conditions& conditions);
   void UpdateIndex();
   void DropIndex();
 
   unsigned long next_id_ = 0;  // the last ID handed out
   Blocks conditions_;
-  // Blocks by a hash of their content, kept once there are many; see FindEqual.
+  // Blocks by a hash of their content, kept once there are many; see FindFirst.
   std::unordered_multimap<std::size_t, Blocks::const_iterator> index_;
   unsigned long indexed_changes_ = 0;
   bool is_index_stale_ = true;
