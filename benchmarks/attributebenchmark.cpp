@@ -27,7 +27,7 @@ using Vexdoc::Conditions;
 using Vexdoc::Spectrum;
 using Vexdoc::Internals::ConditionManager;
 
-constexpr double kTargetMicroseconds = 5.0;
+constexpr double kTargetMicroseconds = 2.0;
 constexpr double kMicro = 1e-6;
 constexpr const char* kType = "VEXColorVector";
 

@@ -195,11 +195,11 @@ void RegisterEngineBenchmarks() {
 Figures EngineResults(const Timings& timings) {
   constexpr double kPairTarget = 200.0;  // ns, 5 million a second
   return {
-      {kTemperature, timings.Seconds(kTemperature) / kMicro, "us", 100.0},
+      {kTemperature, timings.Seconds(kTemperature) / kMicro, "us", 60.0},
       {std::string(kRendering) + ", with its temperature", timings.Seconds(kRendering) / kMicro,
-       "us", 200.0},
+       "us", 60.0},
       {"reconstruction, median of 1,000 surface colours", MedianOfReconstructions() / kMicro, "us",
-       300.0},
+       150.0},
       {kDensity, timings.Seconds(kDensity) / kNano, "ns", 150.0},
       {"CIEDE2000, a pair", timings.SubjectSeconds(kDelta) / kPairs / kNano, "ns", kPairTarget},
       {"CIEDE2000 / Little CMS", timings.Ratio(kDelta), "ratio", {}},

@@ -1,5 +1,5 @@
-// Times and memory of loading and saving documents, times of the colour engine and of asking
-// samples for colours, in one run.
+// Times and memory of loading and saving documents, times of the colour engine, of asking samples
+// for colours and of whole arrays, and of the program and the Python package, in one run.
 //
 // Options: "--tsv" for lines to be read by programs, and those of Google Benchmark.
 
@@ -11,9 +11,11 @@
 
 #include "aldermoor/vexdoc/xmlplatform.h"
 
+#include "benchmarks/arraybenchmark.h"
 #include "benchmarks/attributebenchmark.h"
 #include "benchmarks/enginebenchmark.h"
 #include "benchmarks/loadbenchmark.h"
+#include "benchmarks/outside.h"
 #include "benchmarks/peakmemory.h"
 #include "benchmarks/storebenchmark.h"
 
@@ -48,12 +50,13 @@ int Run(int argc, char** argv) {
   const StoreBenchmark store(workspace);
   RegisterAttributeBenchmarks();
   RegisterEngineBenchmarks();
+  RegisterArrayBenchmarks();
   std::cerr << "times, all benchmarks interleaved ..." << std::endl;
   Timings timings;
   benchmark::RunSpecifiedBenchmarks(&timings);
   Figures figures = load.Results(timings);
-  for (const Figures& more :
-       {store.Results(timings), AttributeResults(timings), EngineResults(timings)}) {
+  for (const Figures& more : {store.Results(timings), AttributeResults(timings),
+                              EngineResults(timings), ArrayResults(timings), OutsideResults()}) {
     figures.insert(figures.end(), more.begin(), more.end());
   }
   if (tsv) {
