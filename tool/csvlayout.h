@@ -8,11 +8,11 @@
 #include <vector>
 
 #include "csvreader.h"
+#include "vocabulary.h"
 
 /// What the columns of a CSV file are, by their headings.
 namespace Aldermoor::Tool {
 
-inline constexpr std::size_t kBands = 36;
 inline constexpr int kFirstBand = 380;  // nm
 inline constexpr int kBandStep = 10;    // nm
 inline constexpr int kLastBand = 730;   // nm

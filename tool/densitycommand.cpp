@@ -34,7 +34,7 @@ using Measure::DensityMode;
 const std::string kStandardKey = "Colorimetric.DensityStandard";
 const std::string kModeKey = "Colorimetric.DensityFilterMode";
 constexpr int kDensityDecimals = 3;
-constexpr float kPercent = 100.0F;
+constexpr float kAsPercent = 100.0F;
 const std::string kShown = "the document";  // its name stands in front of the message
 
 /// What densities are asked for.
@@ -143,9 +143,9 @@ class DensityJob : public SampleJob {
     const Vexdoc::Spectrum& spectrum = solid->second.spectrum;
     cells.insert(cells.end(),
                  {std::string_view(solid->second.name),
-                  kPercent * Measure::DotArea(spectrum, field, mode, request_.options.standard,
-                                              request_.yule_nielsen),
-                  kPercent * Measure::PrintContrast(spectrum, field, mode, request_.options)});
+                  kAsPercent * Measure::DotArea(spectrum, field, mode, request_.options.standard,
+                                                request_.yule_nielsen),
+                  kAsPercent * Measure::PrintContrast(spectrum, field, mode, request_.options)});
   }
 
   const Request& request_;
@@ -188,7 +188,7 @@ class TrappingJob : public SampleJob {
     const std::string channel = WordOf(mode);
     table_.Add(place,
                {std::string_view(fields_.first.sample), std::string_view(fields_.second.sample),
-                std::string_view(channel), kPercent * trapping});
+                std::string_view(channel), kAsPercent * trapping});
   }
 
   void End() override { table_.GetWriter().End(); }

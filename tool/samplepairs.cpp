@@ -11,7 +11,7 @@
 namespace Aldermoor::Tool {
 namespace {
 
-struct Entry {
+struct NamedSample {
   std::string set;
   std::string name;
   const Vexdoc::Sample* sample;
@@ -20,10 +20,10 @@ struct Entry {
 // What two samples that belong together have in common: whether both documents have the set, its
 // name if they have, the name of the sample.
 using Key = std::tuple<bool, std::string, std::string>;
-using Index = std::map<Key, std::vector<const Entry*>>;
+using Index = std::map<Key, std::vector<const NamedSample*>>;
 
-std::vector<Entry> AllSamples(const Vexdoc::VEX& document) {
-  std::vector<Entry> all;
+std::vector<NamedSample> AllSamples(const Vexdoc::VEX& document) {
+  std::vector<NamedSample> all;
   for (const auto& [set, samples] : document.GetSampleSets()) {
     for (const auto& [name, sample] : samples->GetSamples()) {
       all.push_back({set, name, sample.Get()});
@@ -46,20 +46,20 @@ std::set<std::string> CommonSets(const Vexdoc::VEX& first, const Vexdoc::VEX& se
   return common;
 }
 
-Key KeyOf(const Entry& entry, const std::set<std::string>& common) {
+Key KeyOf(const NamedSample& entry, const std::set<std::string>& common) {
   const bool is_common = common.contains(entry.set);
   return {is_common, is_common ? entry.set : "", entry.name};
 }
 
-Index IndexOf(const std::vector<Entry>& entries, const std::set<std::string>& common) {
+Index IndexOf(const std::vector<NamedSample>& entries, const std::set<std::string>& common) {
   Index index;
-  for (const Entry& entry : entries) {
+  for (const NamedSample& entry : entries) {
     index[KeyOf(entry, common)].push_back(&entry);
   }
   return index;
 }
 
-std::string NoPartner(const std::string& path, const Entry& entry, const std::string& other) {
+std::string NoPartner(const std::string& path, const NamedSample& entry, const std::string& other) {
   return fmt::format("{}: {}/{}: there is no such sample in {}", path, entry.set, entry.name,
                      other);
 }
@@ -71,14 +71,14 @@ SamplePairs::SamplePairs(const std::string& reference_path, const Vexdoc::VEX& r
                          const SampleFilter& filter)
     : nothing_paired_(fmt::format("{} and {} have no samples in common", reference_path, path)) {
   const std::set<std::string> common = CommonSets(reference, document);
-  const std::vector<Entry> references = AllSamples(reference);
-  const std::vector<Entry> samples = AllSamples(document);
+  const std::vector<NamedSample> references = AllSamples(reference);
+  const std::vector<NamedSample> samples = AllSamples(document);
   const Index reference_index = IndexOf(references, common);
   const Index sample_index = IndexOf(samples, common);
-  const auto passes = [&filter](const Entry& entry) {
+  const auto passes = [&filter](const NamedSample& entry) {
     return filter.TakesSet(entry.set) && filter.TakesSample(entry.name);
   };
-  for (const Entry& entry : samples) {
+  for (const NamedSample& entry : samples) {
     if (!passes(entry)) {
       continue;
     }
@@ -95,7 +95,7 @@ SamplePairs::SamplePairs(const std::string& reference_path, const Vexdoc::VEX& r
       pairs.push_back({entry.set, entry.name, found->second.front()->sample, entry.sample});
     }
   }
-  for (const Entry& entry : references) {
+  for (const NamedSample& entry : references) {
     if (passes(entry) && !sample_index.contains(KeyOf(entry, common))) {
       unpaired.push_back(NoPartner(reference_path, entry, path));
     }

@@ -15,6 +15,7 @@
 #include "exitstatus.h"
 #include "output.h"
 #include "records.h"
+#include "vocabulary.h"
 
 namespace Aldermoor::Tool {
 
@@ -42,9 +43,6 @@ bool TryFor(const Place& place, const Vexdoc::Sample& sample, Work work) {
     return false;
   }
 }
-
-/// The number of values in the spectra of which colours and densities are computed.
-inline constexpr std::size_t kBands = 36;
 
 /// The first spectrum of the sample, or none.  The sample keeps it.
 const Vexdoc::Spectrum* FindSpectrum(const Vexdoc::Sample& sample);

@@ -43,7 +43,7 @@ struct Found {
   Vexdoc::Spectrum spectrum;
 };
 
-std::string Wavelength(std::size_t band) {
+std::string BandName(std::size_t band) {
   return std::to_string(380 + 10 * band);
 }
 
@@ -51,7 +51,7 @@ void WriteRecords(Format format, Output& output, const std::vector<Found>& all,
                   const Vexdoc::Conditions& request) {
   std::vector<Column> columns;
   for (std::size_t band = 0; band < kBands; ++band) {
-    columns.push_back({Wavelength(band)});
+    columns.push_back({BandName(band)});
   }
   SampleTable table(format, output, false, columns, request.GetAttributes());
   for (const Found& found : all) {
@@ -69,7 +69,7 @@ void WriteTable(Output& output, const std::vector<Found>& all) {
   }
   const auto writer = MakeRecordWriter(Format::kTable, output, columns, {});
   for (std::size_t band = 0; band < kBands; ++band) {
-    const std::string wavelength = Wavelength(band);
+    const std::string wavelength = BandName(band);
     std::vector<Cell> record = {std::string_view(wavelength)};
     for (const Found& found : all) {
       record.emplace_back(found.spectrum.GetData()[band]);

@@ -1,6 +1,7 @@
 #ifndef ALDERMOOR_TOOL_VOCABULARY_H
 #define ALDERMOOR_TOOL_VOCABULARY_H
 
+#include <cstddef>
 #include <optional>
 #include <string>
 #include <string_view>
@@ -9,6 +10,9 @@
 /// The words of the conditions.  The library keeps its default for a word that it does not know,
 /// so a misspelt one is found here or never.
 namespace Aldermoor::Tool {
+
+/// The number of values in the spectra of which colours and densities are computed.
+inline constexpr std::size_t kBands = 36;
 
 inline const std::string kTypeKey = "ColorSpaceDescription.Type";
 inline const std::string kIlluminationKey = "Colorimetric.Illumination";

@@ -21,10 +21,6 @@ class ColorTest : public ToolTest {
   }
 };
 
-float ToFloat(const std::string& text) {
-  return std::strtof(text.c_str(), nullptr);
-}
-
 TEST_F(ColorTest, GrayOfHalfTheReflectanceHasTheLightnessOfTheDefinition) {
   WriteDocument("a.xml", "Set", SampleXml("gray", 0.5));
   // CIE 15:2004, 8.2.1: L* = 116 (Y/Yn)^(1/3) - 16, and a* = b* = 0 for every illuminant.  The

@@ -130,7 +130,7 @@ TEST_F(ConvertTest, EveryFaultyCellIsToldWithItsPlaceAndItsRowCanBeLeftOut) {
   ExpectRefused("a.csv old.xml", "a.csv: and 8 more faults", 3);
 }
 
-struct Case {
+struct Conversion {
   std::string content;
   const char* arguments;
   const char* text;  // a part of what is told
@@ -138,7 +138,7 @@ struct Case {
 };
 
 TEST_F(ConvertTest, ColumnsAndSettingsThatAreNotClearAreRefused) {
-  const Case cases[] = {
+  const Conversion cases[] = {
       {"Name,380,390nm,385,R740\n", "", "730; too many: 385, R740"},
       {"Name" + Bands() + ",380 nm\n", "", "too many: 380 nm"},
       {"380" + Bands() + "\n", "", "1:1: '380' is no heading for the first column"},
@@ -158,7 +158,7 @@ TEST_F(ConvertTest, ColumnsAndSettingsThatAreNotClearAreRefused) {
       {"Name\n", "--condition Physical.SpectrumType=Remision", "Remission, Emission", 2},
       {"", "", "no line with the headings"},
   };
-  for (const Case& one : cases) {
+  for (const Conversion& one : cases) {
     WriteFile("a.csv", one.content);
     ExpectRefused(std::string("a.csv old.xml ") + one.arguments, one.text, one.status);
   }
@@ -217,7 +217,7 @@ TEST_F(ConvertTest, WhatARowCannotCarryIsRefusedOrLeftOutWithTheSample) {
   const std::string lab = LabSampleXml("y", "1", "2", "3");
   std::string other_label = lab;
   other_label.replace(other_label.find("a*"), 2, "u*");
-  const Case cases[] = {
+  const Conversion cases[] = {
       {"<Sample><Name>x</Name>" + whole + whole + "</Sample>", "", "a second spectrum"},
       {"<Sample><Name>x</Name>" + named + "</Sample>", "",
        "a header value 'Description' of its own"},
@@ -226,7 +226,7 @@ TEST_F(ConvertTest, WhatARowCannotCarryIsRefusedOrLeftOutWithTheSample) {
       {other_label, "", "a colour with other channels than those of CIELab"},
       {lab + lab + "</SampleSet><SampleSet><Name>Set</Name>", "", "a second set 'Set'"},
   };
-  for (const Case& one : cases) {
+  for (const Conversion& one : cases) {
     WriteDocument("a.xml", "Set", one.content + lab);
     ExpectRefused("a.xml old.xml --to csv", one.text, 1);
     const Result result = Run("convert a.xml - --to csv --skip-faulty");

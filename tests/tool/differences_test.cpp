@@ -16,10 +16,6 @@ using nlohmann::json;
 
 const std::string kChart = ALDERMOOR_EXAMPLES "/chart24.xml";
 
-float ToFloat(const std::string& text) {
-  return std::strtof(text.c_str(), nullptr);
-}
-
 TEST_F(ToolTest, DiffGivesThePublishedDifferencesOfStoredColours) {
   // G. Sharma, W. Wu, E. N. Dalal, Color Res. Appl. 30, 21 (2005), table 1.  Of the pair "b" by
   // the definitions: dL = 23, da = 22.5, db = -18, C1 = 2.5, C2 = 30.806; CIE 116-1995 divides dC

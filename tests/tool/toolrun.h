@@ -1,12 +1,17 @@
 #ifndef ALDERMOOR_TESTS_TOOL_TOOLRUN_H
 #define ALDERMOOR_TESTS_TOOL_TOOLRUN_H
 
+#include <cstdlib>
 #include <string>
 #include <vector>
 
 #include <gtest/gtest.h>
 
 namespace Aldermoor::Tool {
+
+inline float ToFloat(const std::string& text) {
+  return std::strtof(text.c_str(), nullptr);
+}
 
 /// What a run of the program left behind.
 struct Result {

@@ -55,7 +55,7 @@ constexpr TableCase kIlluminants[] = {
     {10, 0, 5, 780, 380, 0.91F, 0.09F, 594.08, 20885.38},
 };
 
-constexpr TableCase kObservers[] = {
+constexpr TableCase kObserverTables[] = {
     {0, 0, 1, 830, 360, 0.0001299F, 0.000001251141F, 106.865469489595, 22736.095467724695},
     {0, 1, 1, 830, 360, 0.000003917F, 0.00000045181F, 106.8569171011719, 21498.7427173007271},
     {0, 2, 1, 650, 360, 0.0006061F, 0.0F, 106.892251278636, 10161.605439286361},
@@ -95,7 +95,7 @@ TEST(TablesTest, HoldThePublishedValues) {
     SCOPED_TRACE(::testing::Message() << "illuminant " << table.type << ", " << table.number);
     ExpectTable(TristimFilter::GetIlluFilter(Illumination(table.type, table.number)), table);
   }
-  for (const TableCase& table : kObservers) {
+  for (const TableCase& table : kObserverTables) {
     SCOPED_TRACE(::testing::Message() << "observer " << table.type << ", axis " << table.number);
     const auto axis = static_cast<unsigned short>(table.number);
     ExpectTable(TristimFilter::GetObserverFilter(table.type, axis), table);

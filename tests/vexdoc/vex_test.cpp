@@ -17,7 +17,7 @@ namespace {
 
 using Utilities::Exceptions::OutOfRangeException;
 
-VEX Document() {
+VEX DocumentOfTwo() {
   VEX vex("doc");
   vex.AddSample("set", Sample("a"));
   vex.AddSample("set", Sample("b"));
@@ -38,7 +38,7 @@ TEST(VexTest, SetsAreStoredAsCopiesUnderUniqueNames) {
 }
 
 TEST(VexTest, SamplesAreReachedThroughTheirSetWhichTheyBringAlong) {
-  VEX vex = Document();
+  VEX vex = DocumentOfTwo();
   EXPECT_EQ(vex.InsertSample("set", Sample("b"), 0), "b (1)");
   EXPECT_EQ(vex.InsertSample("new", Sample("c"), 0), "c");
   EXPECT_EQ(KeysOf(vex.GetSampleSets()), Keys({"set", "new"}));
@@ -52,7 +52,7 @@ TEST(VexTest, SamplesAreReachedThroughTheirSetWhichTheyBringAlong) {
 TEST(VexTest, FailuresTellWhatIsMissing) {
   const std::string set = "Could not find class Aldermoor::Vexdoc::SampleSet/none";
   const std::string sample = "Could not find class Aldermoor::Vexdoc::Sample/none";
-  VEX vex = Document();
+  VEX vex = DocumentOfTwo();
   EXPECT_EQ(MessageOf<OutOfRangeException>([&] { vex.FindSample("none", "a"); }), set);
   EXPECT_EQ(MessageOf<OutOfRangeException>([&] { vex.FindSample("set", "none"); }), sample);
   EXPECT_EQ(MessageOf<Missing>([&] { vex.GetSampleSet("none"); }), set);
@@ -81,7 +81,7 @@ void ExpectWay(Action action, const Keys& beginnings) {
 }
 
 TEST(VexTest, AFailureCarriesTheWayThatItTook) {
-  const VEX vex = Document();
+  const VEX vex = DocumentOfTwo();
   const std::string here = "::Aldermoor::Vexdoc::VEX::FindSample(): /src/aldermoor/vexdoc/vex.cpp:";
   ExpectWay<OutOfRangeException>([&] { vex.FindSample("set", "none"); }, {here, here});
   ExpectWay<Missing>(
@@ -107,7 +107,7 @@ VEX Everything() {
 
 TEST(VexTest, CopiesAreDeepButShareTheConditions) {
   const VEX original = Everything();
-  VEX assigned = Document();
+  VEX assigned = DocumentOfTwo();
   assigned = original;
   const VEX& itself = assigned;
   assigned = itself;

@@ -2,6 +2,7 @@
 #define ALDERMOOR_VEXDOC_INTERNALS_BINARYFORMAT_H
 
 #include <array>
+#include <cstddef>
 #include <cstdint>
 
 /// What reader and writer of the cache share; docs/binaryformat.md tells the whole format.
@@ -14,6 +15,7 @@ inline constexpr unsigned int kDeepestTree = 256;
 
 /// All numbers in a file are little-endian.
 using Bytes = std::array<char, 4>;
+inline constexpr std::size_t kNumberSize = sizeof(Bytes);
 
 inline std::uint32_t FromLittleEndian(const Bytes& bytes) {
   std::uint32_t value = 0;

@@ -15,7 +15,7 @@ namespace {
 using Kind = CacheField::Kind;
 
 constexpr std::size_t kBytesPerLine = 16;
-constexpr std::size_t kNumberSize = sizeof(BinaryFormat::Bytes);
+using BinaryFormat::kNumberSize;
 constexpr std::size_t kLongestText = 64;
 constexpr unsigned int kOffsetDigits = 8;
 constexpr unsigned int kByteDigits = 2;

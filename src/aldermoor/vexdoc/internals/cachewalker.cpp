@@ -16,7 +16,7 @@ namespace {
 using Kind = CacheField::Kind;
 
 // The least that a record takes, in bytes: its numbers, with all texts and lists empty.
-constexpr std::size_t kNumberSize = sizeof(BinaryFormat::Bytes);
+using BinaryFormat::kNumberSize;
 constexpr std::size_t kEntrySize = 2 * kNumberSize;
 constexpr std::size_t kNodeSize = 3 * kNumberSize;
 constexpr std::size_t kAttributeSize = 4 * kNumberSize;

@@ -16,11 +16,7 @@ using xercesc::DOMNamedNodeMap;
 using xercesc::DOMNode;
 using xercesc::XMLString;
 
-namespace {
-
-constexpr XMLCh kAnyElement[] = u"*";
-
-}  // namespace
+namespace {}  // namespace
 
 DOMNode& NodeHolder::GetXMLNode() const try {
   if (node_ == nullptr) {

@@ -7,6 +7,9 @@
 
 namespace Aldermoor::Vexdoc::Internals {
 
+/// In the place of a name: any.
+inline constexpr XMLCh kAnyElement[] = u"*";
+
 /// A cursor on a DOM node, or on none.  Owns nothing.
 ///
 /// Searches walk from sibling to sibling and compare the parser's own characters: the parser's

@@ -33,8 +33,6 @@ namespace {
 
 using namespace XMLNames;
 
-constexpr XMLCh kAnyElement[] = u"*";
-
 template <class Visit>
 void ForEachElement(const NodeHolder& parent, const XMLCh* name, Visit visit) {
   for (NodeHolder child = parent.FindChild(name, false); !child.IsNull();

@@ -33,8 +33,6 @@ namespace {
 
 using namespace XMLNames;
 
-constexpr XMLCh kAnyElement[] = u"*";
-
 // Calls `visit(name, holder)` for every child that has an attribute, with the value of its first
 // one, whatever child and attribute are called.
 template <class Visit>
