@@ -14,6 +14,7 @@ namespace {
 
 /// What one thread does with its context.
 struct Work {
+  Conditions target;
   Context context;
   std::vector<float> lab;
   std::vector<float> differences;
@@ -38,7 +39,7 @@ TEST(ContextThreadsTest, NeedNoLock) {
   for (std::size_t i = 0; i < kThreads; ++i) {
     Conditions target = lights[5 * i];
     target.AddAttribute(kFormula, i % 2 == 0 ? "2000" : "CMC");
-    expected.push_back({Context(target), {}, {}});
+    expected.push_back({target, Context(target), {}, {}});
     expected.back().Run(spectra);
   }
 
@@ -58,7 +59,9 @@ TEST(ContextThreadsTest, NeedNoLock) {
   for (const Work& work : expected) {
     threads.emplace_back([&] {
       for (int round = 0; round < kRounds; ++round) {
-        Work own = {work.context, {}, {}};
+        // Made here or copied.
+        const Context context = round % 2 == 0 ? Context(work.target) : work.context;
+        Work own = {{}, context, {}, {}};
         own.Run(spectra);
         const auto equal = [](const std::vector<float>& a, const std::vector<float>& b) {
           return std::equal(a.begin(), a.end(), b.begin(), b.end(),

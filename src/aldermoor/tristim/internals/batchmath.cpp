@@ -2,6 +2,7 @@
 
 #include <algorithm>
 #include <array>
+#include <atomic>
 #include <bit>
 #include <cmath>
 #include <cstdint>
@@ -15,6 +16,7 @@
 #define HWY_TARGET_INCLUDE "aldermoor/tristim/internals/batchmath.cpp"
 #include <hwy/foreach_target.h>
 // Behind foreach_target.h.
+#include <hwy/cache_control.h>
 #include <hwy/contrib/math/math-inl.h>
 #include <hwy/highway.h>
 
@@ -52,6 +54,17 @@ Quadruple Row(const Colors& colors, std::size_t row) {
   return {values[0], values[1], values[2], 0.0F};
 }
 
+/// The functions of the header for one instruction set.
+struct Kernels {
+  decltype(&XyzFromSpectra) xyz_from_spectra;
+  decltype(&DensitiesFromSpectra) densities_from_spectra;
+  decltype(&LabFromXyz) lab_from_xyz;
+  decltype(&DeltaE76) delta_e_76;
+  decltype(&DeltaE94) delta_e_94;
+  decltype(&DeltaECmc) delta_e_cmc;
+  decltype(&DeltaE2000) delta_e_2000;
+};
+
 }  // namespace
 }  // namespace Aldermoor::Tristim::Internals::Batch
 
@@ -66,20 +79,20 @@ namespace {
 // A processor without vectors of four floats: one row at a time.
 
 void XyzFromSpectraImpl(const AxisWeights& weights, const float* paper, const Spectra& spectra,
-                        std::size_t count, float* xyz) {
+                        std::size_t count, float* xyz) noexcept {
   for (std::size_t i = 0; i < count; ++i) {
     XyzOfRow(weights, paper, spectra.values + i * spectra.stride, xyz + 3 * i);
   }
 }
 
-void LabFromXyzImpl(const Triple& white, const float* xyz, std::size_t count, float* lab) {
+void LabFromXyzImpl(const Triple& white, const float* xyz, std::size_t count, float* lab) noexcept {
   for (std::size_t i = 0; i < count; ++i) {
     LabOfRow(white, xyz + 3 * i, lab + 3 * i);
   }
 }
 
 void DensitiesFromSpectraImpl(const DensityWeights& weights, const Spectra& spectra,
-                              std::size_t count, float* out) {
+                              std::size_t count, float* out) noexcept {
   for (std::size_t i = 0; i < count; ++i) {
     DensitiesOfRow(weights, spectra.values + i * spectra.stride, out + 4 * i);
   }
@@ -93,26 +106,27 @@ void OverPairs(const Colors& first, const Colors& second, std::size_t count, flo
   }
 }
 
-void DeltaE76Impl(const Colors& first, const Colors& second, std::size_t count, float* out) {
+void DeltaE76Impl(const Colors& first, const Colors& second, std::size_t count,
+                  float* out) noexcept {
   OverPairs(first, second, count, out, Internals::DeltaE76);
 }
 
 void DeltaE94Impl(const Colors& first, const Colors& second, const Triple& weights,
-                  std::size_t count, float* out) {
+                  std::size_t count, float* out) noexcept {
   OverPairs(first, second, count, out, [&](const Quadruple& one, const Quadruple& other) {
     return Internals::DeltaE94(one, other, weights);
   });
 }
 
 void DeltaECmcImpl(const Colors& first, const Colors& second, float l, float c, std::size_t count,
-                   float* out) {
+                   float* out) noexcept {
   OverPairs(first, second, count, out, [=](const Quadruple& one, const Quadruple& other) {
     return Internals::DeltaECmc(one, other, l, c);
   });
 }
 
 void DeltaE2000Impl(const Colors& first, const Colors& second, const Triple& weights,
-                    std::size_t count, float* out) {
+                    std::size_t count, float* out) noexcept {
   OverPairs(first, second, count, out, [&](const Quadruple& one, const Quadruple& other) {
     return Internals::DeltaE2000(one, other, weights);
   });
@@ -249,11 +263,26 @@ struct FourSums {
   F black, cyan, magenta, yellow;
 };
 
+/// Prefetches a ninth of a vector of rows that comes later, another ninth for each four bands:
+/// spread over the arithmetic, the requests do not wait for each other.  Behind the last row there
+/// may be nothing, which a prefetch does not mind.
+HWY_INLINE void PrefetchShare(const float* rows, std::size_t stride, std::size_t band) {
+  constexpr std::size_t kRowsAhead = 32;
+  constexpr std::size_t kLine = 64 / sizeof(float);
+  const std::size_t end = (band + 4) * kLanes / kBands;
+  for (std::size_t row = band * kLanes / kBands; row < end; ++row) {
+    for (std::size_t i = 0; i < kBands; i += kLine) {
+      hwy::Prefetch(rows + (kRowsAhead + row) * stride + i);
+    }
+  }
+}
+
 template <bool kIsRelative, class Sums, class Weights>
 HWY_INLINE Sums Accumulate(const Weights& weights, const float* paper, const float* rows,
                            std::size_t stride) {
   Sums sums;
   for (std::size_t band = 0; band < kBands; band += 4) {
+    PrefetchShare(rows, stride, band);
     F values[4];
     LoadFourBands(rows + band, stride, values[0], values[1], values[2], values[3]);
     for (std::size_t i = 0; i < 4; ++i) {
@@ -286,7 +315,7 @@ void SumXyz(const AxisWeights& weights, const float* paper, const Spectra& spect
 }
 
 void XyzFromSpectraImpl(const AxisWeights& weights, const float* paper, const Spectra& spectra,
-                        std::size_t count, float* xyz) {
+                        std::size_t count, float* xyz) noexcept {
   if (paper == nullptr) {
     SumXyz<false>(weights, paper, spectra, count, xyz);
   } else {
@@ -295,7 +324,7 @@ void XyzFromSpectraImpl(const AxisWeights& weights, const float* paper, const Sp
 }
 
 void DensitiesFromSpectraImpl(const DensityWeights& weights, const Spectra& spectra,
-                              std::size_t count, float* out) {
+                              std::size_t count, float* out) noexcept {
   std::size_t i = 0;
   for (; i + kLanes <= count; i += kLanes) {
     const auto sums = Accumulate<false, FourSums>(
@@ -397,7 +426,7 @@ HWY_INLINE F LabFunction(F t) {
   return result;
 }
 
-void LabFromXyzImpl(const Triple& white, const float* xyz, std::size_t count, float* lab) {
+void LabFromXyzImpl(const Triple& white, const float* xyz, std::size_t count, float* lab) noexcept {
   const auto relative = [](F value, float y_white, float own_white) HWY_ATTR {
     return hn::Div(hn::Div(hn::Mul(value, hn::Set(kF, y_white)), hn::Set(kF, own_white)),
                    hn::Set(kF, 100.0F));
@@ -492,7 +521,8 @@ HWY_INLINE void OverPairs(const Colors& first, const Colors& second, std::size_t
   }
 }
 
-void DeltaE76Impl(const Colors& first, const Colors& second, std::size_t count, float* out) {
+void DeltaE76Impl(const Colors& first, const Colors& second, std::size_t count,
+                  float* out) noexcept {
   const auto run = [](const Lab& one, const Lab& other) HWY_ATTR {
     return Certain(hn::Sqrt(SquaredDistance(one, other)));
   };
@@ -500,7 +530,7 @@ void DeltaE76Impl(const Colors& first, const Colors& second, std::size_t count, 
 }
 
 void DeltaE94Impl(const Colors& first, const Colors& second, const Triple& weights,
-                  std::size_t count, float* out) {
+                  std::size_t count, float* out) noexcept {
   const auto run = [&](const Lab& one, const Lab& other) HWY_ATTR {
     const F chroma = Chroma(one);
     const Delta delta(one, other, chroma);
@@ -535,7 +565,7 @@ HWY_INLINE D CmcWave(D doubled_degrees, D base, D amplitude) {
 }
 
 void DeltaECmcImpl(const Colors& first, const Colors& second, float weight_l, float weight_c,
-                   std::size_t count, float* out) {
+                   std::size_t count, float* out) noexcept {
   const auto run = [=](const Lab& one, const Lab& other) HWY_ATTR {
     const auto set = [](float value) HWY_ATTR {
       return hn::Set(kF, value);
@@ -699,7 +729,7 @@ HWY_INLINE Bounded SquareOf2000(const LabD& first, const LabD& second, D delta_l
 }
 
 void DeltaE2000Impl(const Colors& first, const Colors& second, const Triple& weights,
-                    std::size_t count, float* out) {
+                    std::size_t count, float* out) noexcept {
   const std::array<double, 3> wide_weights = {static_cast<double>(weights[0]),
                                               static_cast<double>(weights[1]),
                                               static_cast<double>(weights[2])};
@@ -742,6 +772,11 @@ void DeltaE2000Impl(const Colors& first, const Colors& second, const Triple& wei
 
 #endif  // HWY_SCALAR
 
+constexpr Kernels kKernels = {
+    &XyzFromSpectraImpl, &DensitiesFromSpectraImpl, &LabFromXyzImpl, &DeltaE76Impl, &DeltaE94Impl,
+    &DeltaECmcImpl,      &DeltaE2000Impl,
+};
+
 }  // namespace
 }  // namespace Aldermoor::Tristim::Internals::Batch::HWY_NAMESPACE
 HWY_AFTER_NAMESPACE();
@@ -749,47 +784,92 @@ HWY_AFTER_NAMESPACE();
 #if HWY_ONCE
 
 namespace Aldermoor::Tristim::Internals::Batch {
+namespace {
 
-HWY_EXPORT(XyzFromSpectraImpl);
-HWY_EXPORT(DensitiesFromSpectraImpl);
-HWY_EXPORT(LabFromXyzImpl);
-HWY_EXPORT(DeltaE76Impl);
-HWY_EXPORT(DeltaE94Impl);
-HWY_EXPORT(DeltaECmcImpl);
-HWY_EXPORT(DeltaE2000Impl);
+struct Compiled {
+  InstructionSet set;
+  const Kernels* kernels;
+};
+
+// The widest first.
+constexpr Compiled kCompiled[] = {
+#if HWY_TARGETS & HWY_AVX3
+    {InstructionSet::kAvx512, &N_AVX3::kKernels},
+#endif
+#if HWY_TARGETS & HWY_AVX2
+    {InstructionSet::kAvx2, &N_AVX2::kKernels},
+#endif
+#if HWY_TARGETS & HWY_SSE4
+    {InstructionSet::kSse4, &N_SSE4::kKernels},
+#endif
+#if HWY_TARGETS & HWY_SSSE3
+    {InstructionSet::kSsse3, &N_SSSE3::kKernels},
+#endif
+    {InstructionSet::kBaseline, &HWY_STATIC_DISPATCH(kKernels)},
+};
+
+std::atomic<const Kernels*> in_use = nullptr;
+
+const Kernels& Use(const Kernels& kernels) noexcept {
+  in_use.store(&kernels, std::memory_order_relaxed);  // a constant: there is nothing to wait for
+  return kernels;
+}
+
+const Kernels& InUse() noexcept {
+  const Kernels* const kernels = in_use.load(std::memory_order_relaxed);
+  if (HWY_LIKELY(kernels != nullptr)) {
+    return *kernels;
+  }
+  const Compiled* const widest =
+      std::find_if(std::begin(kCompiled), std::end(kCompiled) - 1,
+                   [](const Compiled& compiled) { return IsOfProcessor(compiled.set); });
+  return Use(*widest->kernels);
+}
+
+}  // namespace
+
+bool UseInstructionSet(InstructionSet set) noexcept {
+  for (const Compiled& compiled : kCompiled) {
+    if (compiled.set == set && IsOfProcessor(set)) {
+      Use(*compiled.kernels);
+      return true;
+    }
+  }
+  return false;
+}
 
 void XyzFromSpectra(const AxisWeights& weights, const float* paper, const Spectra& spectra,
                     std::size_t count, float* xyz) noexcept {
-  HWY_DYNAMIC_DISPATCH(XyzFromSpectraImpl)(weights, paper, spectra, count, xyz);
+  InUse().xyz_from_spectra(weights, paper, spectra, count, xyz);
 }
 
 void DensitiesFromSpectra(const DensityWeights& weights, const Spectra& spectra, std::size_t count,
                           float* densities) noexcept {
-  HWY_DYNAMIC_DISPATCH(DensitiesFromSpectraImpl)(weights, spectra, count, densities);
+  InUse().densities_from_spectra(weights, spectra, count, densities);
 }
 
 void LabFromXyz(const Triple& white, const float* xyz, std::size_t count, float* lab) noexcept {
-  HWY_DYNAMIC_DISPATCH(LabFromXyzImpl)(white, xyz, count, lab);
+  InUse().lab_from_xyz(white, xyz, count, lab);
 }
 
 void DeltaE76(const Colors& first, const Colors& second, std::size_t count,
               float* differences) noexcept {
-  HWY_DYNAMIC_DISPATCH(DeltaE76Impl)(first, second, count, differences);
+  InUse().delta_e_76(first, second, count, differences);
 }
 
 void DeltaE94(const Colors& first, const Colors& second, const Triple& weights, std::size_t count,
               float* differences) noexcept {
-  HWY_DYNAMIC_DISPATCH(DeltaE94Impl)(first, second, weights, count, differences);
+  InUse().delta_e_94(first, second, weights, count, differences);
 }
 
 void DeltaECmc(const Colors& first, const Colors& second, float l, float c, std::size_t count,
                float* differences) noexcept {
-  HWY_DYNAMIC_DISPATCH(DeltaECmcImpl)(first, second, l, c, count, differences);
+  InUse().delta_e_cmc(first, second, l, c, count, differences);
 }
 
 void DeltaE2000(const Colors& first, const Colors& second, const Triple& weights, std::size_t count,
                 float* differences) noexcept {
-  HWY_DYNAMIC_DISPATCH(DeltaE2000Impl)(first, second, weights, count, differences);
+  InUse().delta_e_2000(first, second, weights, count, differences);
 }
 
 }  // namespace Aldermoor::Tristim::Internals::Batch

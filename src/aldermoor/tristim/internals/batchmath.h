@@ -5,6 +5,7 @@
 
 #include "aldermoor/tristim/internals/colormath.h"
 #include "aldermoor/tristim/internals/densitymath.h"
+#include "aldermoor/tristim/internals/instructionset.h"
 
 /// The formulas of colormath.h, deltaemath.h and densitymath.h over arrays, with the widest vectors
 /// that the processor has.
@@ -50,6 +51,10 @@ void DeltaECmc(const Colors& first, const Colors& second, float l, float c, std:
                float* differences) noexcept;
 void DeltaE2000(const Colors& first, const Colors& second, const Triple& weights, std::size_t count,
                 float* differences) noexcept;
+
+/// Uses this set instead of the widest that there is, from now on: to compare them.  Returns false
+/// and changes nothing if the processor lacks it or the formulas are not compiled for it.
+bool UseInstructionSet(InstructionSet set) noexcept;
 
 }  // namespace Aldermoor::Tristim::Internals::Batch
 
