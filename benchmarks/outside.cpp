@@ -28,9 +28,9 @@ std::string OutputOf(const std::string& command) {
 }  // namespace
 
 Figures OutsideResults() {
-  std::istringstream lines(OutputOf("PYTHONPATH=\"" ALDERMOOR_PYTHON_PATH "\" \"" ALDERMOOR_PYTHON
-                                    "\" \"" ALDERMOOR_OUTSIDE "\" \"" ALDERMOOR_PROGRAM
-                                    "\" \"" ALDERMOOR_ONE_SAMPLE "\""));
+  std::istringstream lines(OutputOf(
+      "PYTHONPATH=\"" ALDERMOOR_PYTHON_PATH "\" \"" ALDERMOOR_PYTHON "\" \"" ALDERMOOR_OUTSIDE
+      "\" \"" ALDERMOOR_PROGRAM "\" \"" ALDERMOOR_ONE_SAMPLE "\" \"" ALDERMOOR_BARE_PARSER "\""));
   Figures figures;
   for (std::string line; std::getline(lines, line);) {
     std::istringstream fields(line);
