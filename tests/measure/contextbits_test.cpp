@@ -237,6 +237,7 @@ TEST(ContextBitsTest, OfDifferencesOfColorsAndOfOneAgainstMany) {
         SCOPED_TRACE(std::string(formula) + " in " + space);
         const Conditions source = Words({{kSpace, space}, {kIllumination, "D50"}});
         std::vector<float> first = SomeXyz(numbers, kRows);
+        numbers.Turn(first);
         std::vector<float> second = numbers.Around(first);
         if (single != 0) {
           (single == 1 ? first : second).resize(3);

@@ -2,6 +2,7 @@
 #define ALDERMOOR_TESTS_MEASURE_SUPPORT_H
 
 #include <array>
+#include <cmath>
 #include <cstddef>
 #include <limits>
 #include <random>
@@ -108,7 +109,18 @@ class Numbers {
     return values;
   }
 
-  /// Rows around `centers` of three channels: near, far, equal, opposite, neutral.
+  /// Turns colours to hues all around, and takes one in seven towards an axis, or to the neutral
+  /// one, as near as floats come.
+  void Turn(std::vector<float>& colors) {
+    for (std::size_t i = 0; i + 2 < colors.size(); i += 3) {
+      for (std::size_t k = i + 1; k < i + 3; ++k) {
+        const bool is_near = i % 7 == 0 && random_() % 3 != 0;
+        colors[k] *= Uniform(-1.0F, 1.0F) * (is_near ? std::pow(10.0F, Uniform(-46.0F, 0.0F)) : 1);
+      }
+    }
+  }
+
+  /// Rows around `centers` of three channels: near, far, equal, opposite, mirrored, neutral.
   std::vector<float> Around(const std::vector<float>& centers) {
     std::vector<float> values = centers;
     for (std::size_t row = 0; row < values.size() / 3; ++row) {
@@ -123,6 +135,10 @@ class Numbers {
       if (row % 13 == 0) {
         v[1] = -v[1];
         v[2] = -v[2];
+      }
+      if (row % 11 < 2) {  // from the centre itself, so that hues are next to each other
+        std::copy_n(centers.begin() + static_cast<std::ptrdiff_t>(3 * row), 3, v);
+        v[1 + row % 2] *= row % 11 == 0 ? -1.0F : Uniform(0.9F, 1.1F);
       }
       if (row % 17 == 0) {
         v[2] = 0.0F;

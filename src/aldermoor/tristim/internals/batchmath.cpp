@@ -719,10 +719,12 @@ HWY_INLINE Bounded SquareOf2000(const LabD& first, const LabD& second, D delta_l
   const D squares = hn::MulAdd(z, z, hn::MulAdd(y, y, SquaredD(x)));
   const D square = hn::MulAdd(hn::Mul(rt, y), z, squares);
 
-  // Chroma and hue are off by some 1e-15 of the chroma, each square by 1e-14 of itself; taken ten
-  // times as much and more.  Beside the jump at half a turn nothing is certain.
-  const D by_chroma = hn::Div(hn::Mul(hn::Mul(set(1e-13), mean), hn::Add(hn::Abs(y), hn::Abs(z))),
-                              set(std::min({1.0, std::abs(weights[1]), std::abs(weights[2])})));
+  // y and z are off by some 1e-15 of the chroma over their weights, also where they are 0 or the
+  // scalar formula's are; all taken ten times as much and more.  Beside the jump at half a turn
+  // nothing is certain.
+  const D off = hn::Div(hn::Mul(set(1e-13), mean),
+                        set(std::min({1.0, std::abs(weights[1]), std::abs(weights[2])})));
+  const D by_chroma = hn::Mul(off, hn::Add(hn::Add(hn::Abs(y), hn::Abs(z)), off));
   const D by_size = hn::Mul(set(1e-12), squares);
   const auto is_at_jump = hn::Lt(hn::Abs(hn::Sub(hn::Abs(apart), pi)), set(1e-9));
   return {square, hn::IfThenElse(is_at_jump, set(1e300), hn::Add(by_chroma, by_size))};
