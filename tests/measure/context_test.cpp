@@ -73,6 +73,18 @@ const Failure kFailures[] = {
        Context(Conditions()).ConvertSpectra(std::span(kTwoSpectra).first(40), out);
      },
      "the spectra have 40 values, which are no rows of 36"},
+    {"broken row behind a gap",
+     [] {
+       std::array<float, 3> out;
+       Context(Conditions()).ConvertSpectra({std::span(kTwoSpectra).first(66), 40}, out);
+     },
+     "the spectra have 66 values, which are no rows of 36, 40 apart"},
+    {"no standard of densities",
+     [] {
+       std::array<float, 8> out;
+       Context(Conditions()).MeasureDensities(kTwoSpectra, {static_cast<DensityStandard>(42)}, out);
+     },
+     "there is no density standard 42"},
     {"broken output",
      [] {
        std::array<float, 5> out;

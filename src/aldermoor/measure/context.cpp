@@ -93,11 +93,14 @@ std::size_t RowsOf(const SpectrumRows& spectra) {
   if (size == 0) {
     return 0;
   }
-  if (size < kBands || (stride == kBands && size % kBands != 0)) {
+  const std::size_t further_rows = size < kBands || stride == 0 ? 0 : (size - kBands) / stride;
+  const std::size_t last_row = size - further_rows * stride;
+  if (last_row < kBands || last_row > std::max(kBands, stride)) {
     Fail("the spectra have " + std::to_string(size) + " values, which are no rows of " +
-         std::to_string(kBands));
+         std::to_string(kBands) +
+         (stride == kBands ? std::string() : ", " + std::to_string(stride) + " apart"));
   }
-  return stride == 0 ? 1 : (size - kBands) / stride + 1;
+  return further_rows + 1;
 }
 
 void CheckRows(std::size_t rows, std::size_t wanted) {
@@ -157,7 +160,11 @@ const DensityFilter& DensityFilterOf(DensityStandard standard) {
   if (standard == DensityStandard::User) {
     Fail("the density standard \"User\" has curves of the process, which a context does not use");
   }
-  return filters.at(static_cast<std::size_t>(standard));
+  const auto number = static_cast<std::size_t>(standard);
+  if (number >= filters.size()) {
+    Fail("there is no density standard " + std::to_string(static_cast<int>(standard)));
+  }
+  return filters[number];
 }
 
 }  // namespace

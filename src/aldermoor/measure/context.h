@@ -22,9 +22,11 @@ inline constexpr std::size_t kBands = 36;
 /// of a reference without light by "FMCII".  The single request throws there.
 inline constexpr float kNoDifference = 1000000.0F;
 
-/// Spectra of 36 bands, one behind the other, in memory of the caller.
+/// Spectra of 36 bands in memory of the caller: reflectances, 1 = perfect reflector, or the
+/// relative power of lights.  They are not limited to a range.
 struct SpectrumRows {
-  /// `row_stride`: floats from the start of one spectrum to that of the next.
+  /// `row_stride`: floats from the start of one spectrum to that of the next; below 36 they
+  /// overlap. Behind the last spectrum the rest of its row may be missing.
   template <class Range>
   requires std::convertible_to<const Range&, std::span<const float>> SpectrumRows(
       const Range& all_values, std::size_t row_stride = kBands)
@@ -48,6 +50,10 @@ struct SpectrumRows {
 /// and in order.  The output says how many rows there are; input and output must not overlap,
 /// unless they are the same colours of three channels.
 /// Nothing is allocated while arrays are computed.
+///
+/// Units: Y of the perfect reflector is 100, and so is its L*; x, y, u', v' 0 to 1; RGB 0 to 255;
+/// CMYK in percent; angles of hue in degrees.  Input is not checked, and what is not a number makes
+/// results that are none, but 255 in "RGB" and the greatest value in a density.
 ///
 /// Throws: MeasureException where a single request would fail for every row, with its reason, and
 /// for arrays whose lengths do not fit; the output is unchanged then.
@@ -88,8 +94,9 @@ class ALDERMOOR_EXPORT Context {
                             std::span<float> differences,
                             const DifferenceWeights& weights = {}) const;
 
-  /// Densities of reflectance spectra: black, cyan, magenta, yellow; without a calibration.
-  /// Throws also for the standard "User", whose curves are those of the process.
+  /// Densities of reflectance spectra: black, cyan, magenta, yellow; decadic, without a
+  /// calibration. Where a filter lets nothing through, it is 11.99 for black and 9.99 for the
+  /// others. Throws also for the standard "User", whose curves are those of the process.
   void MeasureDensities(const SpectrumRows& spectra, const DensityOptions& options,
                         std::span<float> densities) const;
 
