@@ -35,19 +35,22 @@ struct Source {
 
   bool IsSpectra() const { return word == kSpectra; }
 
-  // With what the result is to be under `key`.
+  // With what the result is to be under `key`.  Waits for the library only if it must: others may
+  // be at work in it for long.
   Context MakeContext(const char* key, const std::string& value) const {
-    const LibraryLock lock;
+    std::optional<LibraryLock> lock;
+    if (!view.HasNamedIlluminant()) {
+      lock.emplace();
+    }
     Vexdoc::Conditions target = MakeConditions(view);
     if (paper_white) {
-      target.AddAttribute("Colorimetric.WhiteBase", "Paper");
+      SetCondition(target, "Colorimetric.WhiteBase", "Paper");
     }
-    Vexdoc::Conditions own;
+    Vexdoc::Conditions own = IsSpectra() ? Vexdoc::Conditions() : Vexdoc::Conditions(target);
     if (!IsSpectra()) {
-      own = target;
-      own.AddAttribute("ColorSpaceDescription.Type", word);
+      SetCondition(own, "ColorSpaceDescription.Type", word);
     }
-    target.AddAttribute(key, value);
+    SetCondition(target, key, value);
     return Context(target, own, paper_white);
   }
 

@@ -3,6 +3,7 @@
 #include <algorithm>
 #include <charconv>
 #include <limits>
+#include <map>
 #include <string_view>
 #include <vector>
 
@@ -49,6 +50,14 @@ void CheckWord(const char* argument, const std::string& word, const char* list) 
   }
 }
 
+// AddAttribute also counts the changes of shared blocks, in a number of the process that it writes
+// even where it adds nothing.
+void SetCondition(Vexdoc::Conditions& conditions, const std::string& key,
+                  const std::string& value) {
+  using Attributes = std::map<std::string, std::string>;
+  const_cast<Attributes&>(conditions.GetAttributes()).insert_or_assign(key, value);
+}
+
 Bands ReadBands(const char* argument, const py::object& values) {
   std::vector<float> numbers;
   try {
@@ -73,11 +82,11 @@ std::optional<Bands> ReadPaper(const py::object& paper) {
 Vexdoc::Conditions MakeConditions(const Viewing& viewing) {
   CheckWord("observer", viewing.observer, "OBSERVERS");
   Vexdoc::Conditions conditions;
-  conditions.AddAttribute("Colorimetric.Observer", viewing.observer);
-  if (py::isinstance<py::str>(viewing.illuminant)) {
-    conditions.AddAttribute(kIllumination, IlluminationOf(viewing.illuminant.cast<std::string>()));
+  SetCondition(conditions, "Colorimetric.Observer", viewing.observer);
+  if (viewing.HasNamedIlluminant()) {
+    SetCondition(conditions, kIllumination, IlluminationOf(viewing.illuminant.cast<std::string>()));
   } else {
-    conditions.AddAttribute(kIllumination, "Userdefined");
+    SetCondition(conditions, kIllumination, "Userdefined");
     conditions.SetCustomIllumination(MakeSpectrum(ReadBands("illuminant", viewing.illuminant)));
   }
   return conditions;
@@ -86,7 +95,7 @@ Vexdoc::Conditions MakeConditions(const Viewing& viewing) {
 Vexdoc::Conditions MakeConditions(const Viewing& viewing, const std::string& space) {
   CheckWord("space", space, "COLOR_SPACES");
   Vexdoc::Conditions conditions = MakeConditions(viewing);
-  conditions.AddAttribute("ColorSpaceDescription.Type", space);
+  SetCondition(conditions, "ColorSpaceDescription.Type", space);
   return conditions;
 }
 
