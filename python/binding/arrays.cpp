@@ -1,5 +1,7 @@
 #include <algorithm>
 #include <array>
+#include <bitset>
+#include <cmath>
 #include <limits>
 #include <optional>
 #include <string>
@@ -68,6 +70,60 @@ Measure::SpectrumRows Spectra(const Rows& rows) {
   return {rows.GetValues(), rows.GetStride()};
 }
 
+bool IsNaN(float value) {
+  return std::isnan(value);
+}
+
+// Fills the rows of spectra that are not there, for which the library may give numbers all the
+// same: always those of `missing`, its result for a spectrum of NaN.  Rows with other numbers need
+// no look at their spectra.
+void FillMissing(const Rows& spectra, std::span<const float> missing, std::span<float> results) {
+  if (std::ranges::all_of(missing, IsNaN)) {
+    return;
+  }
+  for (std::size_t row = 0; row < spectra.GetCount(); ++row) {
+    const auto result = results.subspan(row * missing.size(), missing.size());
+    if (std::ranges::equal(result, missing) && std::ranges::any_of(spectra.GetRow(row), IsNaN)) {
+      std::ranges::fill(result, kNaN);
+    }
+  }
+}
+
+constexpr auto kMissingSpectrum = [] {
+  Bands bands{};
+  bands.fill(kNaN);
+  return bands;
+}();
+
+// Colours that miss a channel have none in another colour space either.  They are found block by
+// block before the conversion, which may be in place.
+void ConvertColors(const Context& context, std::span<const float> colors,
+                   std::span<float> converted) {
+  constexpr std::size_t kBlock = 1024;
+  const std::size_t from = context.GetSourceChannels();
+  const std::size_t to = context.GetTargetChannels();
+  const std::size_t rows = converted.size() / to;
+  std::size_t begin = 0;
+  do {  // no rows at all have their errors too
+    const std::size_t count = std::min(kBlock, rows - begin);
+    const auto block = colors.subspan(from * begin, from * count);
+    const auto results = converted.subspan(to * begin, to * count);
+    std::bitset<kBlock> missing;
+    for (std::size_t i = 0; i < block.size(); ++i) {
+      if (IsNaN(block[i])) {
+        missing.set(i / from);
+      }
+    }
+    context.ConvertColors(block, results);
+    for (std::size_t row = 0; missing.any() && row < count; ++row) {
+      if (missing.test(row)) {
+        std::ranges::fill(results.subspan(to * row, to), kNaN);
+      }
+    }
+    begin += count;
+  } while (begin < rows);
+}
+
 constexpr const char* kConvert =
     R"(convert(values, space="CIELab", *, illuminant="D50", observer="TwoDegree", source="Spectrum", paper=None, out=None)
 --
@@ -83,7 +139,8 @@ source: "Spectrum" or the colour space of `values`.
 paper: 36 reflectances to which the colours are relative.
 out: float32, shape (n, channels), C-contiguous: where the result goes.
 
-Returns float32, shape (n, channels), or `out`.  A row without a colour is NaN.
+Returns float32, shape (n, channels), or `out`.  A row without a colour is NaN, and so is one
+that has NaN anywhere in `values`.
 Raises MeasureError if there is no way from the source to the space.)";
 
 FloatArray Convert(const py::object& values, const std::string& space, const py::object& illuminant,
@@ -104,8 +161,11 @@ FloatArray Convert(const py::object& values, const std::string& space, const py:
   const py::gil_scoped_release release;
   if (source.IsSpectra()) {
     context.ConvertSpectra(Spectra(rows), colors);
+    std::array<float, 3> missing{};
+    context.ConvertSpectra(kMissingSpectrum, missing);
+    FillMissing(rows, missing, colors);
   } else {
-    context.ConvertColors(rows.GetValues(), colors);
+    ConvertColors(context, rows.GetValues(), colors);
   }
   return result;
 }
@@ -122,7 +182,8 @@ formula: "CIELab", "CIELuv", "LABhx", "FMCII", "CMC", "94", "2000"; for colours,
     "CMC", "94", "2000".
 weights: l and c of "CMC", kL, kC and kH of "94" and "2000"; 0 for the usual one, 2:1 and 1:1:1.
 
-Returns float32, shape (n,), or `out`.  A difference that cannot be computed is NaN.)";
+Returns float32, shape (n,), or `out`.  A difference that cannot be computed is NaN, and so is one
+of rows that have NaN anywhere.)";
 
 FloatArray DeltaE(const py::object& a, const py::object& b, const std::string& formula,
                   const std::array<float, 3>& weights, const py::object& illuminant,
@@ -168,7 +229,7 @@ values: float32, shape (n, 36) or (36,), as for `convert`.
 standard: "DIN", "DINNB", "ANSIA", "ANSIE", "ANSII", "ANSIT", "SPI".
 paper: 36 reflectances whose densities are taken off.
 
-Returns float32, shape (n, 4), or `out`.)";
+Returns float32, shape (n, 4), or `out`; a row that has NaN anywhere in `values` is NaN.)";
 
 FloatArray Density(const py::object& values, const std::string& standard, const py::object& paper,
                    const py::object& out) {
@@ -181,6 +242,9 @@ FloatArray Density(const py::object& values, const std::string& standard, const 
   const std::span<float> densities = ValuesOf(result);
   const py::gil_scoped_release release;
   context.MeasureDensities(Spectra(rows), options, densities);
+  std::array<float, 4> missing{};
+  context.MeasureDensities(kMissingSpectrum, options, missing);
+  FillMissing(rows, missing, densities);
   return result;
 }
 

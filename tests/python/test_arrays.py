@@ -1,6 +1,8 @@
 """Colorimetry on arrays, against published figures and against single samples."""
 
 import itertools
+from collections.abc import Callable
+from functools import partial
 
 import numpy
 import pytest
@@ -159,6 +161,49 @@ def test_what_cannot_be_computed_is_nan() -> None:
     assert (rendering.valid.tolist(), rendering.reference.tolist()) == ([False], [""])
     found = aldermoor.reconstruct(numpy.concatenate([row(50, 200, 200), row(50, 0, 0)]))
     assert numpy.isnan(found).all(axis=1).tolist() == [True, False]
+
+
+def rows_of_nan(values: Floats, band: int) -> Floats:
+    """`values` with a number missing in every second row."""
+    values = values.copy()
+    values[::2, band] = numpy.nan
+    return values
+
+
+@pytest.mark.parametrize("band", [0, 17, 35])
+def test_what_is_missing_has_no_result(spectra: Floats, band: int) -> None:
+    # White and black look like results for NaN: the numbers at the ends of their ranges.
+    spectra = numpy.concatenate([spectra, 9 * PERFECT, 9 * PERFECT, 0 * PERFECT, 0 * PERFECT])
+    missing = rows_of_nan(spectra, band)
+    functions: list[Callable[[Floats], Floats]] = [
+        *(partial(aldermoor.convert, space=s) for s in aldermoor.COLOR_SPACES if s != "CMYK"),
+        *(partial(aldermoor.density, standard=s) for s in aldermoor.DENSITY_STANDARDS),
+        *(partial(aldermoor.delta_e, PERFECT, formula=f) for f in aldermoor.FORMULAS),
+    ]
+    for function in functions:
+        expected = function(spectra)
+        assert not numpy.isnan(expected).any(), function
+        expected[::2] = numpy.nan
+        numpy.testing.assert_array_equal(function(missing), expected, err_msg=str(function))
+        assert numpy.isnan(function(missing[0])).all(), function
+
+
+@pytest.mark.parametrize("source", aldermoor.COLOR_SPACES)
+def test_colours_that_miss_a_channel_have_no_result(source: ColorSpace) -> None:
+    channels = len(aldermoor.channels(source))
+    colors = numpy.linspace(1, 90, 3000 * channels, dtype=numpy.float32).reshape(-1, channels)
+    for space, channel in itertools.product(aldermoor.COLOR_SPACES, range(channels)):
+        missing = rows_of_nan(colors, channel)
+        try:
+            expected = aldermoor.convert(colors, space, source=source)
+        except aldermoor.MeasureError:
+            continue
+        expected[::2] = numpy.nan
+        found = aldermoor.convert(missing, space, source=source)
+        numpy.testing.assert_array_equal(found, expected, err_msg=space)
+        if found.shape == missing.shape and channels == 3:
+            aldermoor.convert(missing, space, source=source, out=missing)
+            numpy.testing.assert_array_equal(missing, expected, err_msg=space)
 
 
 def test_densities_are_logarithms() -> None:
