@@ -38,7 +38,14 @@ from aldermoor._errors import (
     ParseError,
 )
 from aldermoor._results import ColorRendering, Item, SampleRows
-from aldermoor._words import COLOR_SPACES, DENSITY_STANDARDS, FORMULAS, ILLUMINANTS, OBSERVERS
+from aldermoor._words import (
+    COLOR_SPACES,
+    DENSITY_STANDARDS,
+    FORMULAS,
+    ILLUMINANTS,
+    OBSERVERS,
+    SPECTRUM_TYPES,
+)
 
 __all__ = [
     "COLOR_SPACES",
@@ -46,6 +53,7 @@ __all__ = [
     "FORMULAS",
     "ILLUMINANTS",
     "OBSERVERS",
+    "SPECTRUM_TYPES",
     "Attribute",
     "ColorRendering",
     "ColorVector",

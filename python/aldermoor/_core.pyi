@@ -5,7 +5,16 @@ import numpy
 from numpy.typing import NDArray
 
 from aldermoor._results import ColorRendering, Item, SampleRows
-from aldermoor._words import ColorSpace, DensityStandard, Formula, Observer
+from aldermoor._words import (
+    ColorSpace,
+    Comparable,
+    DensityStandard,
+    Formula,
+    Observer,
+    Reconstructible,
+    Source,
+    SpectrumType,
+)
 
 __version__: str
 
@@ -95,7 +104,7 @@ class SampleSet(_Element):
     def __delitem__(self, name: str, /) -> None: ...
     def rename(self, old: str, new: str) -> str: ...
     def add_sample(self, name: str) -> Sample: ...
-    def spectra(self) -> SampleRows: ...
+    def spectra(self, *, type: SpectrumType | None = None) -> SampleRows: ...
     def colors(
         self,
         space: ColorSpace = "CIELab",
@@ -116,7 +125,7 @@ class Document(_Element):
     def __delitem__(self, name: str, /) -> None: ...
     def rename(self, old: str, new: str) -> str: ...
     def add_set(self, name: str) -> SampleSet: ...
-    def spectra(self) -> SampleRows: ...
+    def spectra(self, *, type: SpectrumType | None = None) -> SampleRows: ...
     def colors(
         self,
         space: ColorSpace = "CIELab",
@@ -137,7 +146,7 @@ def convert(
     *,
     illuminant: _Illuminant = "D50",
     observer: Observer = "TwoDegree",
-    source: str = "Spectrum",
+    source: Source = "Spectrum",
     paper: _Numbers | None = None,
     out: _Floats | None = None,
 ) -> _Floats: ...
@@ -149,7 +158,7 @@ def delta_e(
     weights: tuple[float, float, float] = (0.0, 0.0, 0.0),
     illuminant: _Illuminant = "D50",
     observer: Observer = "TwoDegree",
-    source: str = "Spectrum",
+    source: Comparable = "Spectrum",
     paper: _Numbers | None = None,
     out: _Floats | None = None,
 ) -> _Floats: ...
@@ -166,7 +175,7 @@ def color_temperature(
 def color_rendering(values: _Floats) -> ColorRendering: ...
 def reconstruct(
     colors: _Floats,
-    source: str = "CIELab",
+    source: Reconstructible = "CIELab",
     *,
     illuminant: _Illuminant = "D50",
     observer: Observer = "TwoDegree",

@@ -26,7 +26,8 @@ using Measure::Context;
 using Measure::kBands;
 
 constexpr float kNaN = std::numeric_limits<float>::quiet_NaN();
-const std::string kSpectra = "Spectrum";
+const std::string kReflectances = "Spectrum";
+const std::string kLights = "Emission";
 
 /// What an array holds, and under which conditions.
 struct Source {
@@ -35,7 +36,12 @@ struct Source {
     CheckWord("source", word, "SOURCES");
   }
 
-  bool IsSpectra() const { return word == kSpectra; }
+  bool IsSpectra() const { return word == kReflectances || word == kLights; }
+  // Under the illuminant of lights there is nothing else to see.
+  bool IsLights() const {
+    return word == kLights || (word == kReflectances && view.HasNamedIlluminant() &&
+                               view.illuminant.cast<std::string>() == kLights);
+  }
 
   // With what the result is to be under `key`.  Waits for the library only if it must: others may
   // be at work in it for long.
@@ -49,7 +55,9 @@ struct Source {
       SetCondition(target, "Colorimetric.WhiteBase", "Paper");
     }
     Vexdoc::Conditions own = IsSpectra() ? Vexdoc::Conditions() : Vexdoc::Conditions(target);
-    if (!IsSpectra()) {
+    if (IsLights()) {
+      SetCondition(own, "Colorimetric.Illumination", kLights);
+    } else if (!IsSpectra()) {
       SetCondition(own, "ColorSpaceDescription.Type", word);
     }
     SetCondition(target, key, value);
@@ -130,13 +138,15 @@ constexpr const char* kConvert =
 
 Colours of spectra, or of colours, in the colour space `space`.
 
-values: float32, shape (n, 36): reflectances, 1 = perfect reflector, at 380 nm to 730 nm by 10 nm;
-    with another `source`, colours of that space, shape (n, channels).  One row alone may come
-    without the axis of rows, and the result has none then either.
-illuminant: "D65", "F11" ..., a daylight as "6500K", 36 numbers of relative power, or "Emission"
-    for spectra of lights.  Colours are taken as those of this illuminant, not adapted to it.
-source: "Spectrum" or the colour space of `values`.
-paper: 36 reflectances to which the colours are relative.
+values: float32, shape (n, 36): spectra at 380 nm to 730 nm by 10 nm; with a colour space as
+    `source`, colours of that space, shape (n, channels).  One row alone may come without the axis
+    of rows, and the result has none then either.
+illuminant: "D65", "F11" ..., a daylight as "6500K", or 36 numbers of relative power.  Colours are
+    taken as those of this illuminant, not adapted to it.  "Emission" makes the spectra those of
+    lights.
+source: "Spectrum" for reflectances, 1 = perfect reflector; "Emission" for lights, whose colours
+    are their own whatever the illuminant; or the colour space of `values`.
+paper: 36 reflectances to which the colours are relative, except those of lights.
 out: float32, shape (n, channels), C-contiguous: where the result goes.
 
 Returns float32, shape (n, channels), or `out`.  A row without a colour is NaN, and so is one
@@ -181,9 +191,13 @@ a, b: as `values` of `convert`; `a` is the reference where the formula has one: 
 formula: "CIELab", "CIELuv", "LABhx", "FMCII", "CMC", "94", "2000"; for colours, one of "CIELab",
     "CMC", "94", "2000".
 weights: l and c of "CMC", kL, kC and kH of "94" and "2000"; 0 for the usual one, 2:1 and 1:1:1.
+illuminant, paper: as for `convert`.
+source: "Spectrum", "Emission", or the colour space of `a` and `b`: "CIELab", "CIEXYZ" or "RGB".
+out: float32, shape (n,), C-contiguous: where the result goes.
 
 Returns float32, shape (n,), or `out`.  A difference that cannot be computed is NaN, and so is one
-of rows that have NaN anywhere.)";
+of rows that have NaN anywhere.
+Raises MeasureError if the formula does not take what the source says.)";
 
 FloatArray DeltaE(const py::object& a, const py::object& b, const std::string& formula,
                   const std::array<float, 3>& weights, const py::object& illuminant,
@@ -228,6 +242,7 @@ Densities of reflectance spectra: black (visual), cyan, magenta, yellow; uncalib
 values: float32, shape (n, 36) or (36,), as for `convert`.
 standard: "DIN", "DINNB", "ANSIA", "ANSIE", "ANSII", "ANSIT", "SPI".
 paper: 36 reflectances whose densities are taken off.
+out: float32, shape (n, 4), C-contiguous: where the result goes.
 
 Returns float32, shape (n, 4), or `out`; a row that has NaN anywhere in `values` is NaN.)";
 
@@ -269,12 +284,12 @@ py::tuple Channels(const std::string& space) {
 void AddArrays(py::module_& module) {
   using py::arg;
   module.def("convert", &Convert, kConvert, arg("values"), arg("space") = "CIELab", py::kw_only(),
-             arg("illuminant") = "D50", arg("observer") = "TwoDegree", arg("source") = kSpectra,
-             arg("paper") = py::none(), arg("out") = py::none());
+             arg("illuminant") = "D50", arg("observer") = "TwoDegree",
+             arg("source") = kReflectances, arg("paper") = py::none(), arg("out") = py::none());
   module.def("delta_e", &DeltaE, kDeltaE, arg("a"), arg("b"), arg("formula") = "2000",
              py::kw_only(), arg("weights") = std::array<float, 3>{}, arg("illuminant") = "D50",
-             arg("observer") = "TwoDegree", arg("source") = kSpectra, arg("paper") = py::none(),
-             arg("out") = py::none());
+             arg("observer") = "TwoDegree", arg("source") = kReflectances,
+             arg("paper") = py::none(), arg("out") = py::none());
   module.def("density", &Density, kDensity, arg("values"), arg("standard") = "DIN", py::kw_only(),
              arg("paper") = py::none(), arg("out") = py::none());
   module.def("channels", &Channels, kChannels, arg("space"));

@@ -1,5 +1,6 @@
 #include <algorithm>
 #include <map>
+#include <optional>
 #include <sstream>
 #include <string>
 #include <utility>
@@ -168,12 +169,18 @@ void AddContainer(py::class_<Container, Owner<Container>>& type, const char* nam
 template <class Container>
 void AddRows(py::class_<Container, Owner<Container>>& type) {
   using py::arg;
-  type.def("spectra", py::overload_cast<const Container&>(&SpectraOf), R"(spectra()
+  type.def("spectra",
+           py::overload_cast<const Container&, const std::optional<std::string>&>(&SpectraOf),
+           R"(spectra(*, type=None)
 --
 
 The first spectrum of every sample: SampleRows with `values` of shape (n, 36), `names` and `sets`.
 
-A sample without a spectrum of 36 values has a row of NaN.)");
+type: only spectra of this type, by their condition Physical.SpectrumType: "Remission" ...  Lights,
+    whose Colorimetric.Illumination is "Emission", are "Emission" whatever that condition says.
+
+A sample without such a spectrum of 36 values has a row of NaN.)",
+           py::kw_only(), arg("type") = py::none());
   type.def("colors",
            py::overload_cast<const Container&, const std::string&, const py::object&,
                              const std::string&, const py::object&>(&ColorsOf),

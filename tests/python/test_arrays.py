@@ -9,7 +9,7 @@ import pytest
 from numpy.typing import NDArray
 
 import aldermoor
-from aldermoor._words import ColorSpace, Formula, Observer
+from aldermoor._words import ColorSpace, Formula, Observer, Spectra, SpectrumType
 
 Floats = NDArray[numpy.float32]
 PERFECT = numpy.ones((1, 36), numpy.float32)
@@ -69,6 +69,40 @@ def test_arrays_equal_samples_to_the_last_bit(
         found = aldermoor.convert(spectra, space, illuminant=illuminant, observer=observer)
         numpy.testing.assert_array_equal(found, expected, err_msg=space)
         assert not numpy.isnan(found).any()
+
+
+@pytest.mark.parametrize("paper", [None, numpy.linspace(0.8, 0.9, 36)])
+@pytest.mark.parametrize("illuminant", ["D50", "F11", "7000K", [1.0] * 36, "Emission"])
+def test_lights_equal_samples_to_the_last_bit(
+    spectra: Floats, illuminant: str | list[float], paper: NDArray[numpy.float64] | None
+) -> None:
+    document = aldermoor.Document()
+    samples = document.add_set("s")
+    shines = {"Colorimetric.Illumination": "Emission"}
+    emission = {"Physical.SpectrumType": "Emission"}
+    kinds: list[dict[str, str]] = [{}, shines, shines | emission, {"Physical.SpectrumType": "Transmission"}]
+    for values, conditions in zip(spectra, itertools.cycle(kinds)):
+        samples.add_sample("x").add_spectrum(values, conditions)
+    rows: dict[SpectrumType, list[int]] = {"Remission": [0], "Emission": [1, 2]}
+    sources: dict[SpectrumType, Spectra] = {"Remission": "Spectrum", "Emission": "Emission"}
+    for kind, source in sources.items():
+        values = document.spectra(type=kind).values
+        there = numpy.isin(numpy.arange(24) % 4, rows[kind])
+        numpy.testing.assert_array_equal(~numpy.isnan(values).any(axis=1), there)
+        if illuminant == "Emission" and kind != "Emission":
+            continue  # makes lights of what a document has as reflectances
+        for space in aldermoor.COLOR_SPACES:
+            if space != "CMYK":
+                expected = document.colors(space, illuminant=illuminant, paper=paper).values
+                expected[~there] = numpy.nan
+                found = aldermoor.convert(
+                    values, space, illuminant=illuminant, paper=paper, source=source
+                )
+                numpy.testing.assert_array_equal(found, expected, err_msg=f"{space} {kind}")
+    numpy.testing.assert_array_equal(
+        aldermoor.convert(spectra, illuminant="Emission", paper=paper),
+        aldermoor.convert(spectra, illuminant="Emission", paper=paper, source="Emission"),
+    )
 
 
 def test_colours_go_from_space_to_space(spectra: Floats) -> None:
