@@ -10,7 +10,6 @@
 #include <pybind11/stl.h>
 
 #include "aldermoor/measure/context.h"
-#include "aldermoor/vexdoc/colorvector.h"
 
 #include "lock.h"
 #include "module.h"
@@ -220,9 +219,6 @@ FloatArray DeltaE(const py::object& a, const py::object& b, const std::string& f
   const std::span<float> differences = ValuesOf(result);
   const Measure::DifferenceWeights usual{weights[0], weights[1], weights[2]};
   const py::gil_scoped_release release;
-  if (differences.empty()) {
-    return result;
-  }
   const std::size_t failed =
       source.IsSpectra()
           ? context.CompareSpectra(Spectra(first), Spectra(second), differences, usual)
@@ -250,7 +246,11 @@ FloatArray Density(const py::object& values, const std::string& standard, const 
                    const py::object& out) {
   CheckWord("standard", standard, "DENSITY_STANDARDS");
   const Measure::DensityOptions options{Measure::DensityStandardOf(standard), !paper.is_none()};
-  const Context context({}, {}, ReadPaper(paper));
+  const std::optional<Bands> paper_white = ReadPaper(paper);
+  if (paper_white && std::ranges::all_of(*paper_white, [](float v) { return v <= 0.0F; })) {
+    throw py::value_error("paper: expected reflectances of which one at least is above 0");
+  }
+  const Context context({}, {}, paper_white);
   const Rows rows("values", values, kBands, Rows::Layout::kAnyStride);
   FloatArray result = MakeResult(out, rows.GetCount(), rows.IsSingle(), 4);
   CheckApart(result, rows);
@@ -270,13 +270,7 @@ The labels of the channels of a colour space, in order: ("L*", "a*", "b*").)";
 
 py::tuple Channels(const std::string& space) {
   const LibraryLock lock;
-  const Vexdoc::Conditions conditions = MakeConditions({py::str("D50"), "TwoDegree"}, space);
-  const Vexdoc::ColorVector black(conditions, std::vector<float>(space == "CMYK" ? 4 : 3));
-  py::list labels;
-  for (const auto& [label, value] : black.GetDatastore()) {
-    labels.append(label);
-  }
-  return py::tuple(labels);
+  return py::tuple(py::cast(LabelsOf(space)));
 }
 
 }  // namespace

@@ -1,4 +1,5 @@
 #include <algorithm>
+#include <iterator>
 #include <map>
 #include <optional>
 #include <sstream>
@@ -107,18 +108,31 @@ Owner<Attribute> Add(Sample& sample, Attribute* attribute) {
 
 Owner<Vexdoc::Spectrum> AddSpectrum(Sample& sample, const std::vector<float>& values,
                                     const Texts& texts) {
+  CheckFinite("values", values);
   const LibraryLock lock;
   Vexdoc::Conditions conditions = MakeSpectrumConditions(values.size());
   Apply(texts, conditions);
   return Add(sample, new Vexdoc::Spectrum(conditions, values));
 }
 
+// The library takes fewer, and then cannot read what it wrote.
+void CheckChannels(const std::string& space, std::size_t count) {
+  const std::size_t expected = CountChannels(space);
+  if (count != expected) {
+    const py::object labels = py::str(", ").attr("join")(LabelsOf(space));
+    throw py::value_error("values: expected " + std::to_string(expected) + " numbers for " + space +
+                          " (" + labels.cast<std::string>() + "), got " + std::to_string(count));
+  }
+}
+
 Owner<Vexdoc::ColorVector> AddColor(Sample& sample, const std::vector<float>& values,
                                     const std::string& space, const py::object& illuminant,
                                     const std::string& observer, const Texts& texts) {
+  CheckFinite("values", values);
   const LibraryLock lock;
   Vexdoc::Conditions conditions = MakeConditions({illuminant, observer}, space);
   Apply(texts, conditions);
+  CheckChannels(conditions.GetAttribute("ColorSpaceDescription.Type"), values.size());
   return Add(sample, new Vexdoc::ColorVector(conditions, values));
 }
 
@@ -145,12 +159,26 @@ void AddContainer(py::class_<Container, Owner<Container>>& type, const char* nam
     const LibraryLock lock;
     return Owner<Element>(self.FindElement(key));
   });
-  type.def("__contains__", [](const Container& self, const std::string& key) {
+  type.def("__getitem__", [](const Container& self, py::ssize_t index) {
     const LibraryLock lock;
     const auto& elements = self.GetElements();
-    return std::any_of(elements.begin(), elements.end(),
-                       [&key](const auto& entry) { return entry.first == key; });
+    const auto count = static_cast<py::ssize_t>(elements.size());
+    if (index < -count || index >= count) {
+      throw py::index_error(std::to_string(index) + " is no index of " + std::to_string(count));
+    }
+    return Owner<Element>(std::next(elements.begin(), index < 0 ? count + index : index)->second);
   });
+  const auto any = [](const Container& self, auto is_wanted) {
+    const LibraryLock lock;
+    return std::ranges::any_of(self.GetElements(), is_wanted);
+  };
+  type.def("__contains__", [any](const Container& self, const std::string& key) {
+    return any(self, [&](const auto& entry) { return entry.first == key; });
+  });
+  type.def("__contains__", [any](const Container& self, const Element& element) {
+    return any(self, [&](const auto& entry) { return entry.second.Get() == &element; });
+  });
+  type.def("__contains__", [](const Container&, const py::object&) { return false; });
   type.def("__delitem__", [](Container& self, const std::string& key) {
     const LibraryLock lock;
     self.RemoveElement(self.FindElement(key));
@@ -237,7 +265,10 @@ Raises NotFoundError or MeasureError if the sample cannot give it.)",
 Adds a spectrum and returns it.
 
 values: numbers, 1 = perfect reflector; for colours there must be 36, at 380 nm to 730 nm.
-conditions: what is not said is a reflectance at these wavelengths.)",
+conditions: what is not said is a reflectance at these wavelengths; of a light,
+    Colorimetric.Illumination is "Emission".
+
+Raises ValueError for NaN and infinity, which no file keeps.)",
            arg("values"), arg("conditions") = Texts());
   type.def(
       "add_color", &AddColor,
@@ -247,7 +278,9 @@ conditions: what is not said is a reflectance at these wavelengths.)",
 Adds a colour and returns it.
 
 values: a number for each channel.
-conditions: further ones.)",
+conditions: further ones.
+
+Raises ValueError for another number of channels, and for NaN and infinity, which no file keeps.)",
       arg("values"), arg("space") = "CIELab", py::kw_only(), arg("illuminant") = "D50",
       arg("observer") = "TwoDegree", arg("conditions") = Texts());
 }
@@ -300,9 +333,13 @@ Adds an empty set and returns it; its name has a number behind it if `name` was 
 
 Writes the document as XML; with `cache`, a binary cache beside it too.
 
-The file is replaced as a whole, or stays as it was.  Raises FileError.)",
+Values are written with six significant digits.  The file is replaced as a whole, or stays as it
+was.  Raises FileError.)",
            arg("path"), arg("cache") = false);
-  type.def("dumps", &Dumps, "dumps()\n--\n\nThe document as XML in UTF-8.");
+  type.def("dumps", &Dumps, R"(dumps()
+--
+
+The document as XML in UTF-8, as `save` writes it: values have six significant digits.)");
 }
 
 }  // namespace

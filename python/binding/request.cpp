@@ -2,12 +2,15 @@
 
 #include <algorithm>
 #include <charconv>
+#include <cmath>
 #include <limits>
 #include <map>
 #include <string_view>
 #include <vector>
 
 #include <pybind11/stl.h>
+
+#include "aldermoor/vexdoc/colorvector.h"
 
 namespace Aldermoor::Python {
 namespace {
@@ -58,6 +61,14 @@ void SetCondition(Vexdoc::Conditions& conditions, const std::string& key,
   const_cast<Attributes&>(conditions.GetAttributes()).insert_or_assign(key, value);
 }
 
+void CheckFinite(const char* argument, std::span<const float> values) {
+  const auto odd = std::ranges::find_if_not(values, [](float v) { return std::isfinite(v); });
+  if (odd != values.end()) {
+    throw py::value_error(std::string(argument) + ": expected finite numbers, got " +
+                          std::to_string(*odd));
+  }
+}
+
 Bands ReadBands(const char* argument, const py::object& values) {
   std::vector<float> numbers;
   try {
@@ -71,6 +82,7 @@ Bands ReadBands(const char* argument, const py::object& values) {
     throw py::value_error(std::string(argument) + ": expected 36 numbers, got " +
                           std::to_string(numbers.size()));
   }
+  CheckFinite(argument, numbers);
   std::copy(numbers.begin(), numbers.end(), bands.begin());
   return bands;
 }
@@ -97,6 +109,16 @@ Vexdoc::Conditions MakeConditions(const Viewing& viewing, const std::string& spa
   Vexdoc::Conditions conditions = MakeConditions(viewing);
   SetCondition(conditions, "ColorSpaceDescription.Type", space);
   return conditions;
+}
+
+std::vector<std::string> LabelsOf(const std::string& space) {
+  const Vexdoc::Conditions conditions = MakeConditions({py::str("D50"), "TwoDegree"}, space);
+  const Vexdoc::ColorVector black(conditions, std::vector<float>(CountChannels(space)));
+  std::vector<std::string> labels;
+  for (const auto& [label, value] : black.GetDatastore()) {
+    labels.push_back(label);
+  }
+  return labels;
 }
 
 Vexdoc::Conditions MakeSpectrumConditions(std::size_t count) {

@@ -4,7 +4,9 @@
 #include <array>
 #include <cstddef>
 #include <optional>
+#include <span>
 #include <string>
+#include <vector>
 
 #include <pybind11/pybind11.h>
 
@@ -37,6 +39,9 @@ void CheckWord(const char* argument, const std::string& word, const char* list);
 /// Sets a condition without the LibraryLock, if nobody else has these conditions.
 void SetCondition(Vexdoc::Conditions& conditions, const std::string& key, const std::string& value);
 
+/// Throws: ValueError that names `argument`, if a value is NaN or infinite.
+void CheckFinite(const char* argument, std::span<const float> values);
+
 /// Throws: TypeError, ValueError.
 Bands ReadBands(const char* argument, const pybind11::object& values);
 /// Nothing for None.
@@ -45,6 +50,12 @@ std::optional<Bands> ReadPaper(const pybind11::object& paper);
 /// Throws: ValueError for words that are none, and what ReadBands throws.
 Vexdoc::Conditions MakeConditions(const Viewing& viewing);
 Vexdoc::Conditions MakeConditions(const Viewing& viewing, const std::string& space);
+
+inline std::size_t CountChannels(const std::string& space) {
+  return space == "CMYK" ? 4 : 3;
+}
+/// The labels of the channels of a colour space.  Needs the LibraryLock.
+std::vector<std::string> LabelsOf(const std::string& space);
 
 /// The conditions of a reflectance spectrum of `count` values; the range of wavelengths is there
 /// for 36.

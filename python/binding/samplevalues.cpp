@@ -161,7 +161,7 @@ py::object ColorsTable(const Container& container, const std::string& space,
                        const py::object& illuminant, const std::string& observer,
                        const py::object& paper) {
   const std::optional<Bands> paper_white = ReadPaper(paper);
-  RowTable table(space == "CMYK" ? 4 : 3);
+  RowTable table(CountChannels(space));
   const LibraryLock lock;
   const Vexdoc::Conditions request = MakeRequest(space, {illuminant, observer}, paper_white);
   {

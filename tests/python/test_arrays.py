@@ -3,6 +3,7 @@
 import itertools
 from collections.abc import Callable
 from functools import partial
+from pathlib import Path
 
 import numpy
 import pytest
@@ -154,10 +155,13 @@ def test_every_layout_gives_the_same(spectra: Floats) -> None:
     )
 
 
-def test_results_go_where_they_are_wanted(spectra: Floats) -> None:
+def test_results_go_where_they_are_wanted(spectra: Floats, tmp_path: Path) -> None:
     out = numpy.zeros((24, 3), numpy.float32)
     assert aldermoor.convert(spectra, out=out) is out
     numpy.testing.assert_array_equal(out, aldermoor.convert(spectra))
+    mapped = numpy.memmap(tmp_path / "out", numpy.float32, "w+", shape=(24, 3))
+    assert aldermoor.convert(spectra, out=mapped) is mapped
+    numpy.testing.assert_array_equal(mapped, out)
     differences = numpy.zeros(24, numpy.float32)
     assert aldermoor.delta_e(spectra, spectra[0], out=differences) is differences
     assert differences[0] == 0 and (differences[1:] > 0).all()

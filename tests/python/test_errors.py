@@ -1,5 +1,6 @@
 """Failures: the class, the text, the place."""
 
+import math
 from collections.abc import Callable
 from pathlib import Path
 from typing import Any
@@ -14,6 +15,10 @@ ONES = numpy.ones((2, 36), numpy.float32)
 LAB = numpy.ones((2, 3), numpy.float32)
 # Arguments that no type checker lets through.
 ANY: Any = aldermoor
+
+
+def sample() -> aldermoor.Sample:
+    return aldermoor.Document().add_set("s").add_sample("e")
 
 
 @pytest.mark.parametrize(
@@ -48,20 +53,51 @@ ANY: Any = aldermoor
             "out: overlaps",
         ),
         (lambda: aldermoor.delta_e(ONES, ONES[[0, 0, 1]]), ValueError, "2 and 3 rows"),
+        (
+            lambda: ANY.delta_e(LAB[:0], LAB[:0], "FMCII", source="CIEXYZ"),
+            aldermoor.MeasureError,
+            "FMCII",
+        ),
+        (
+            lambda: aldermoor.convert(ONES.view(numpy.ma.MaskedArray)),
+            TypeError,
+            r"values: .*mask; fill it with \.filled\(numpy\.nan\)",
+        ),
+        (lambda: aldermoor.density(ONES, paper=[0] * 36), ValueError, "paper: .*above 0"),
         (lambda: ANY.delta_e(ONES, ONES, "1976"), ValueError, "formula: '1976' is none of"),
         (lambda: ANY.density(ONES, "User"), ValueError, "standard: 'User' is none of DIN"),
         (lambda: ANY.reconstruct(LAB, "CIELCh"), ValueError, "source: 'CIELCh' is none of"),
         (lambda: aldermoor.Document()["x"], aldermoor.NotFoundError, "SampleSet/x"),
+        (lambda: sample().spectrum, aldermoor.NotFoundError, "'e' has no spectrum"),
         (
-            lambda: aldermoor.Document().add_set("s").add_sample("e").spectrum,
-            aldermoor.NotFoundError,
-            "'e' has no spectrum",
-        ),
-        (
-            lambda: aldermoor.Document().add_set("s").add_sample("e").add_spectrum([1, 2]),
+            lambda: sample().add_spectrum([1, 2]),
             aldermoor.MissingConditionError,
             "Physical.WavelengthSpectrumM",
         ),
+        # What a file would not give back.
+        (
+            lambda: sample().add_color([1, 2]),
+            ValueError,
+            r"expected 3 numbers for CIELab \(L\*, a\*, b\*\), got 2",
+        ),
+        (lambda: sample().add_color([1] * 6, "RGB"), ValueError, "for RGB .*, got 6"),
+        (lambda: sample().add_color([1] * 3, "CMYK"), ValueError, "expected 4 .*, got 3"),
+        (
+            lambda: sample().add_color([1] * 3, conditions={"ColorSpaceDescription.Type": "CMYK"}),
+            ValueError,
+            "for CMYK .*, got 3",
+        ),
+        (lambda: sample().add_color([1, 2, math.nan]), ValueError, "values: .*finite.*, got nan"),
+        (lambda: sample().add_spectrum([-math.inf] * 36), ValueError, "values: .*, got -inf"),
+        (lambda: sample().add_spectrum([1e300] * 36), ValueError, "values: .*, got inf"),
+        (
+            lambda: sample().add_color([1, 2, 3], illuminant=[math.nan] * 36),
+            ValueError,
+            "illuminant: .*, got nan",
+        ),
+        (lambda: aldermoor.Document()[0], IndexError, "0 is no index of 0"),
+        (lambda: ANY.Document().spectra(type="Light"), ValueError, "type: 'Light' is none of"),
+        (lambda: aldermoor.Sample(), TypeError, "No constructor"),  # type: ignore[call-arg]
     ],
 )
 def test_what_is_wrong_is_told(
