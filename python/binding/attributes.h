@@ -49,7 +49,7 @@ void AddHeader(Type& type) {
           self.RemoveAttribute(key);
         }
       },
-      "set_header(key, value)\n--\n\nSets a header field, or removes it with None.",
+      "set_header(self, key, value)\n--\n\nSets a header field, or removes it with None.",
       pybind11::arg("key"), pybind11::arg("value"));
 }
 

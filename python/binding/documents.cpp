@@ -189,7 +189,8 @@ void AddContainer(py::class_<Container, Owner<Container>>& type, const char* nam
         const LibraryLock lock;
         return self.RenameElement(old_name, new_name);
       },
-      "rename(old, new)\n--\n\nReturns the new name, with a number behind it if it was taken.",
+      "rename(self, old, new)\n--\n\nReturns the new name, with a number behind it if it was "
+      "taken.",
       py::arg("old"), py::arg("new"));
 }
 
@@ -199,7 +200,7 @@ void AddRows(py::class_<Container, Owner<Container>>& type) {
   using py::arg;
   type.def("spectra",
            py::overload_cast<const Container&, const std::optional<std::string>&>(&SpectraOf),
-           R"(spectra(*, type=None)
+           R"(spectra(self, *, type=None)
 --
 
 The first spectrum of every sample: SampleRows with `values` of shape (n, 36), `names` and `sets`.
@@ -212,7 +213,7 @@ A sample without such a spectrum of 36 values has a row of NaN.)",
   type.def("colors",
            py::overload_cast<const Container&, const std::string&, const py::object&,
                              const std::string&, const py::object&>(&ColorsOf),
-           R"(colors(space="CIELab", *, illuminant="D50", observer="TwoDegree", paper=None)
+           R"(colors(self, space="CIELab", *, illuminant="D50", observer="TwoDegree", paper=None)
 --
 
 The colour of every sample: SampleRows with `values` of shape (n, channels), `names` and `sets`.
@@ -246,7 +247,7 @@ void AddSampleClass(py::module_& module) {
       },
       "The values of the first spectrum: float32, shape (36,) as a rule; a copy.");
   type.def("color", &ColorOf,
-           R"(color(space="CIELab", *, illuminant="D50", observer="TwoDegree", paper=None)
+           R"(color(self, space="CIELab", *, illuminant="D50", observer="TwoDegree", paper=None)
 --
 
 The colour of the sample: a stored one that was measured so, else one computed from the spectrum,
@@ -259,7 +260,7 @@ Returns float32, shape (channels,).
 Raises NotFoundError or MeasureError if the sample cannot give it.)",
            arg("space") = "CIELab", py::kw_only(), arg("illuminant") = "D50",
            arg("observer") = "TwoDegree", arg("paper") = py::none());
-  type.def("add_spectrum", &AddSpectrum, R"(add_spectrum(values, conditions={})
+  type.def("add_spectrum", &AddSpectrum, R"(add_spectrum(self, values, conditions={})
 --
 
 Adds a spectrum and returns it.
@@ -272,7 +273,7 @@ Raises ValueError for NaN and infinity, which no file keeps.)",
            arg("values"), arg("conditions") = Texts());
   type.def(
       "add_color", &AddColor,
-      R"(add_color(values, space="CIELab", *, illuminant="D50", observer="TwoDegree", conditions={})
+      R"(add_color(self, values, space="CIELab", *, illuminant="D50", observer="TwoDegree", conditions={})
 --
 
 Adds a colour and returns it.
@@ -297,7 +298,7 @@ void AddSetClass(py::module_& module) {
         const LibraryLock lock;
         return Owner<Sample>(self.AddElement(name));
       },
-      R"(add_sample(name)
+      R"(add_sample(self, name)
 --
 
 Adds an empty sample and returns it; its name has a number behind it if `name` was taken.)",
@@ -313,7 +314,7 @@ void AddDocumentClass(py::module_& module) {
              const LibraryLock lock;
              return Owner<VEX>(new VEX(name));
            }),
-           arg("name") = "");
+           "__init__(self, name=\"\")\n--\n\nA document without sets.", arg("name") = "");
   AddHeader(type);
   AddContainer<VEX, SampleSet>(type, "sets");
   AddRows(type);
@@ -323,12 +324,12 @@ void AddDocumentClass(py::module_& module) {
         const LibraryLock lock;
         return Owner<SampleSet>(self.AddElement(name));
       },
-      R"(add_set(name)
+      R"(add_set(self, name)
 --
 
 Adds an empty set and returns it; its name has a number behind it if `name` was taken.)",
       arg("name"));
-  type.def("save", &Save, R"(save(path, cache=False)
+  type.def("save", &Save, R"(save(self, path, cache=False)
 --
 
 Writes the document as XML; with `cache`, a binary cache beside it too.
@@ -336,7 +337,7 @@ Writes the document as XML; with `cache`, a binary cache beside it too.
 Values are written with six significant digits.  The file is replaced as a whole, or stays as it
 was.  Raises FileError.)",
            arg("path"), arg("cache") = false);
-  type.def("dumps", &Dumps, R"(dumps()
+  type.def("dumps", &Dumps, R"(dumps(self)
 --
 
 The document as XML in UTF-8, as `save` writes it: values have six significant digits.)");

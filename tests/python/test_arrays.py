@@ -81,7 +81,8 @@ def test_lights_equal_samples_to_the_last_bit(
     samples = document.add_set("s")
     shines = {"Colorimetric.Illumination": "Emission"}
     emission = {"Physical.SpectrumType": "Emission"}
-    kinds: list[dict[str, str]] = [{}, shines, shines | emission, {"Physical.SpectrumType": "Transmission"}]
+    transmission = {"Physical.SpectrumType": "Transmission"}
+    kinds: list[dict[str, str]] = [{}, shines, shines | emission, transmission]
     for values, conditions in zip(spectra, itertools.cycle(kinds)):
         samples.add_sample("x").add_spectrum(values, conditions)
     rows: dict[SpectrumType, list[int]] = {"Remission": [0], "Emission": [1, 2]}
