@@ -34,6 +34,7 @@ from aldermoor._errors import (
     FileError,
     MeasureError,
     MissingConditionError,
+    MissingFileError,
     NotFoundError,
     ParseError,
 )
@@ -63,6 +64,7 @@ __all__ = [
     "Item",
     "MeasureError",
     "MissingConditionError",
+    "MissingFileError",
     "NotFoundError",
     "ParseError",
     "Recipe",

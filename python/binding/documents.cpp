@@ -1,13 +1,18 @@
 #include <algorithm>
+#include <cerrno>
+#include <filesystem>
 #include <iterator>
 #include <map>
 #include <optional>
 #include <sstream>
 #include <string>
+#include <string_view>
+#include <system_error>
 #include <utility>
 #include <vector>
 
 #include <pybind11/stl.h>
+#include <unistd.h>
 
 #include "aldermoor/utilities/exceptions/exceptions.h"
 #include "aldermoor/vexdoc/colorvector.h"
@@ -35,21 +40,62 @@ using Vexdoc::VEX;
 
 // ---- files
 
-File FileOf(const py::object& path) {
-  return File(py::module_::import("os").attr("fsencode")(path).cast<std::string>());
+struct Path {
+  explicit Path(const py::object& path)
+      : name(py::module_::import("os").attr("fspath")(path)),
+        bytes(py::module_::import("os").attr("fsencode")(name).cast<std::string>()) {
+    if (bytes.find('\0') != std::string::npos) {
+      throw py::value_error("path: has a NUL character");
+    }
+    if (bytes.empty()) {
+      ThrowFileError(ENOENT, name, nullptr);
+    }
+  }
+
+  py::object name;  // as Python knows it
+  std::string bytes;
+};
+
+// Why a file cannot be read, or 0: the library says no more than that it is not accessible, and of
+// folders that they are no XML.
+int ErrorOfReading(const std::string& path) {
+  std::error_code error;
+  const auto status = std::filesystem::status(path, error);
+  if (!std::filesystem::exists(status)) {
+    return error ? error.value() : ENOENT;
+  }
+  if (std::filesystem::is_directory(status)) {
+    return EISDIR;
+  }
+  return ::access(path.c_str(), R_OK) == 0 ? 0 : errno;
 }
 
-Owner<VEX> Load(const py::object& path, bool cache) {
-  const File file = FileOf(path);
+// Why one cannot be written, or 0: the library's text ends with the reason of the system.
+int ErrorOfWriting(std::string_view text) {
+  constexpr int kMany = 200;
+  for (int error = 1; error < kMany; ++error) {
+    if (text.ends_with(": " + std::generic_category().message(error))) {
+      return error;
+    }
+  }
+  return 0;
+}
+
+Owner<VEX> Load(const py::object& given, bool cache) {
+  const Path path(given);
   const LibraryLock lock;
   const SmartPointer<VEX> document(new VEX);
   try {
     const LibraryAlone library;
-    document->LoadXML(file, cache);
-  } catch (const Vexdoc::VexParseException&) {
-    throw;
+    document->LoadXML(File(path.bytes), cache);
   } catch (const Vexdoc::VexException& e) {
-    ThrowAs(file.IsAccessable(false) ? "ParseError" : "FileError", e);
+    if (const int error = ErrorOfReading(path.bytes)) {
+      ThrowFileError(error, path.name, &e);
+    }
+    if (dynamic_cast<const Vexdoc::VexParseException*>(&e) != nullptr) {
+      throw;
+    }
+    ThrowAs("ParseError", e);
   }
   return Owner<VEX>(document);
 }
@@ -61,8 +107,6 @@ Owner<VEX> Loads(const std::string& text) {
   try {
     const LibraryAlone library;
     document->Load(in);
-  } catch (const Vexdoc::VexParseException&) {
-    throw;
   } catch (const Vexdoc::VexException& e) {
     ThrowAs("ParseError", e);
   }
@@ -70,12 +114,16 @@ Owner<VEX> Loads(const std::string& text) {
 }
 
 // Keeps the interpreter: the locale of the process is another one meanwhile.
-void Save(const VEX& document, const py::object& path, bool cache) {
-  File file = FileOf(path);
+void Save(const VEX& document, const py::object& given, bool cache) {
+  const Path path(given);
   const LibraryLock lock;
   try {
+    File file(path.bytes);
     document.SaveXML(file, cache);
   } catch (const ResourceNotAvailableException& e) {
+    if (const int error = ErrorOfWriting(e.what())) {
+      ThrowFileError(error, path.name, &e);
+    }
     ThrowAs("FileError", e);
   }
 }

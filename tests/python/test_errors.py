@@ -1,6 +1,9 @@
 """Failures: the class, the text, the place."""
 
+import errno
 import math
+import os
+import pickle
 from collections.abc import Callable
 from pathlib import Path
 from typing import Any
@@ -121,14 +124,47 @@ def test_no_illegal_document_is_read(name: str) -> None:
         aldermoor.load(DATA / "illegal" / name)
 
 
-def test_files_that_cannot_be_used_have_an_error_of_the_system(tmp_path: Path) -> None:
-    attempts: list[Callable[[], object]] = [
-        lambda: aldermoor.load(tmp_path / "none.xml"),
-        lambda: aldermoor.load(tmp_path / "none" / "none.xml"),
-        lambda: aldermoor.Document().save(tmp_path / "none" / "x.xml"),
-    ]
-    for attempt in attempts:
-        with pytest.raises(OSError, match="none") as caught:
-            attempt()
-        assert isinstance(caught.value, aldermoor.FileError)
-        assert caught.value.trace
+def test_a_text_of_no_file_has_a_place_without_one() -> None:
+    with pytest.raises(aldermoor.ParseError) as caught:
+        aldermoor.loads("<a>\n<b></a>")
+    assert (caught.value.file, caught.value.line) == (None, 2)
+
+
+def load(path: str | Path) -> None:
+    aldermoor.load(path)
+
+
+def save(path: str | Path) -> None:
+    aldermoor.Document().save(path)
+
+
+@pytest.mark.parametrize("use", [load, save])
+@pytest.mark.parametrize(
+    ("name", "number"),
+    [
+        ("none/x.xml", errno.ENOENT),
+        ("file/x.xml", errno.ENOTDIR),
+        (".", errno.EISDIR),
+    ],
+)
+def test_files_that_cannot_be_used_have_an_error_of_the_system(
+    use: Callable[[str | Path], None], name: str, number: int, tmp_path: Path
+) -> None:
+    (tmp_path / "file").write_text("")
+    path = tmp_path / name
+    with pytest.raises(OSError) as caught:
+        use(path)
+    assert isinstance(caught.value, FileNotFoundError) == (number == errno.ENOENT)
+    assert isinstance(caught.value, aldermoor.FileError)
+    assert (caught.value.errno, caught.value.filename) == (number, str(path))
+    assert os.strerror(number) in str(caught.value) and caught.value.trace
+    again = pickle.loads(pickle.dumps(caught.value))
+    assert (type(again), str(again)) == (type(caught.value), str(caught.value))
+
+
+@pytest.mark.parametrize("use", [load, save])
+def test_paths_that_are_none_are_refused(use: Callable[[str | Path], None]) -> None:
+    with pytest.raises(FileNotFoundError):
+        use("")
+    with pytest.raises(ValueError, match="path: has a NUL"):
+        use("a\0b")
