@@ -34,11 +34,19 @@ from aldermoor._errors import (
     FileError,
     MeasureError,
     MissingConditionError,
+    MissingFileError,
     NotFoundError,
     ParseError,
 )
 from aldermoor._results import ColorRendering, Item, SampleRows
-from aldermoor._words import COLOR_SPACES, DENSITY_STANDARDS, FORMULAS, ILLUMINANTS, OBSERVERS
+from aldermoor._words import (
+    COLOR_SPACES,
+    DENSITY_STANDARDS,
+    FORMULAS,
+    ILLUMINANTS,
+    OBSERVERS,
+    SPECTRUM_TYPES,
+)
 
 __all__ = [
     "COLOR_SPACES",
@@ -46,6 +54,7 @@ __all__ = [
     "FORMULAS",
     "ILLUMINANTS",
     "OBSERVERS",
+    "SPECTRUM_TYPES",
     "Attribute",
     "ColorRendering",
     "ColorVector",
@@ -55,6 +64,7 @@ __all__ = [
     "Item",
     "MeasureError",
     "MissingConditionError",
+    "MissingFileError",
     "NotFoundError",
     "ParseError",
     "Recipe",

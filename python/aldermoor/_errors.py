@@ -11,13 +11,18 @@ class Error(Exception):
 
 
 class FileError(Error, OSError):
-    """A file cannot be read or written; the text has the reason of the system."""
+    """A file cannot be read or written; `errno`, `strerror` and `filename` as of any OSError."""
+
+
+class MissingFileError(FileError, FileNotFoundError):
+    """There is no such file or folder."""
 
 
 class ParseError(Error, ValueError):
     """What is read is no document; the text says what is wrong.
 
-    `file`, `line` and `column`, counted from 1, where the text is not well-formed XML.
+    `line` and `column`, counted from 1, where the text is not well-formed XML, and `file` if it
+    is that of a file.
     """
 
     file: str | None = None

@@ -11,14 +11,20 @@ ColorSpace = Literal[
 Observer = Literal["TwoDegree", "TenDegree"]
 Formula = Literal["CIELab", "CIELuv", "LABhx", "FMCII", "CMC", "94", "2000"]
 DensityStandard = Literal["DIN", "DINNB", "ANSIA", "ANSIE", "ANSII", "ANSIT", "SPI"]
+SpectrumType = Literal["Remission", "Emission", "Transmission", "AmbientLight", "Flash"]
+Reconstructible = Literal["CIELab", "CIEXYZ", "RGB"]
+"""Colour spaces with a way to CIELab."""
+Spectra = Literal["Spectrum", "Emission"]
+Source = Spectra | ColorSpace
+Comparable = Spectra | Reconstructible
 
 COLOR_SPACES: tuple[ColorSpace, ...] = get_args(ColorSpace)
 OBSERVERS: tuple[Observer, ...] = get_args(Observer)
 FORMULAS: tuple[Formula, ...] = get_args(Formula)
 DENSITY_STANDARDS: tuple[DensityStandard, ...] = get_args(DensityStandard)
-
-SPECTRUM = "Spectrum"
-SOURCES: tuple[str, ...] = (SPECTRUM, *COLOR_SPACES)
+SPECTRUM_TYPES: tuple[SpectrumType, ...] = get_args(SpectrumType)
+SOURCES: tuple[str, ...] = (*get_args(Spectra), *COLOR_SPACES)
+RECONSTRUCTIBLE: tuple[Reconstructible, ...] = get_args(Reconstructible)
 
 ILLUMINANTS: tuple[str, ...] = (
     "A", "B", "C", "D50", "D55", "D65", "D75",
@@ -26,6 +32,3 @@ ILLUMINANTS: tuple[str, ...] = (
     "Emission",
 )  # fmt: skip
 """Illuminants with a name; beside them "6500K", a daylight, and 36 values of relative power."""
-
-RECONSTRUCTIBLE = ("CIELab", "CIEXYZ", "RGB")
-"""Colour spaces with a way to CIELab."""

@@ -126,15 +126,18 @@ void AddColorVectorClass(py::module_& module) {
 void AddRecipeClass(py::module_& module) {
   py::class_<Recipe, SampleAttribute, Owner<Recipe>> type(
       module, "Recipe", "How a colour is mixed.  Units are those of the application.");
-  const auto text = [&type](const char* name, auto get) {
-    type.def_property_readonly(name, [get](const Recipe& self) {
-      const LibraryLock lock;
-      return (self.*get)();
-    });
+  const auto member = [&type](const char* name, auto get, const char* help) {
+    type.def_property_readonly(
+        name,
+        [get](const Recipe& self) {
+          const LibraryLock lock;
+          return (self.*get)();
+        },
+        help);
   };
-  text("assortment", &Recipe::GetAssortmentName);
-  text("thickness", &Recipe::GetThickness);
-  text("substrate", &Recipe::GetSubstrateLinkName);
+  member("assortment", &Recipe::GetAssortmentName, "The name of the assortment of the components.");
+  member("thickness", &Recipe::GetThickness, "The thickness of the layer.");
+  member("substrate", &Recipe::GetSubstrateLinkName, "The name of what lies under the layer.");
   type.def_property_readonly(
       "components",
       [](const Recipe& self) {

@@ -15,17 +15,22 @@ namespace Aldermoor::Python {
 template <class Type>
 void AddHeader(Type& type) {
   using Element = typename Type::type;
-  const auto text = [&type](const char* name, std::string (Element::*get)() const) {
-    type.def_property_readonly(name, [get](const Element& self) {
-      const LibraryLock lock;
-      return (self.*get)();
-    });
+  const auto text = [&type](const char* name, std::string (Element::*get)() const,
+                            const char* help) {
+    type.def_property_readonly(
+        name,
+        [get](const Element& self) {
+          const LibraryLock lock;
+          return (self.*get)();
+        },
+        help);
   };
-  text("name", &Element::GetName);
-  text("created", &Element::GetCreationDateTime);
-  text("modified", &Element::GetModificationDateTime);
-  text("description", &Element::GetDescription);
-  text("creator", &Element::GetCreator);
+  text("name", &Element::GetName, "The name; may be empty.");
+  text("created", &Element::GetCreationDateTime, "The header field Created, or an empty text.");
+  text("modified", &Element::GetModificationDateTime,
+       "The header field Modified, or an empty text.");
+  text("description", &Element::GetDescription, "The header field Description, or an empty text.");
+  text("creator", &Element::GetCreator, "The header field Creator, or an empty text.");
   type.def_property_readonly(
       "header",
       [](const Element& self) {
@@ -44,7 +49,7 @@ void AddHeader(Type& type) {
           self.RemoveAttribute(key);
         }
       },
-      "set_header(key, value)\n--\n\nSets a header field, or removes it with None.",
+      "set_header(self, key, value)\n--\n\nSets a header field, or removes it with None.",
       pybind11::arg("key"), pybind11::arg("value"));
 }
 

@@ -1,11 +1,18 @@
 #include <algorithm>
+#include <cerrno>
+#include <filesystem>
+#include <iterator>
 #include <map>
+#include <optional>
 #include <sstream>
 #include <string>
+#include <string_view>
+#include <system_error>
 #include <utility>
 #include <vector>
 
 #include <pybind11/stl.h>
+#include <unistd.h>
 
 #include "aldermoor/utilities/exceptions/exceptions.h"
 #include "aldermoor/vexdoc/colorvector.h"
@@ -33,21 +40,62 @@ using Vexdoc::VEX;
 
 // ---- files
 
-File FileOf(const py::object& path) {
-  return File(py::module_::import("os").attr("fsencode")(path).cast<std::string>());
+struct Path {
+  explicit Path(const py::object& path)
+      : name(py::module_::import("os").attr("fspath")(path)),
+        bytes(py::module_::import("os").attr("fsencode")(name).cast<std::string>()) {
+    if (bytes.find('\0') != std::string::npos) {
+      throw py::value_error("path: has a NUL character");
+    }
+    if (bytes.empty()) {
+      ThrowFileError(ENOENT, name, nullptr);
+    }
+  }
+
+  py::object name;  // as Python knows it
+  std::string bytes;
+};
+
+// Why a file cannot be read, or 0: the library says no more than that it is not accessible, and of
+// folders that they are no XML.
+int ErrorOfReading(const std::string& path) {
+  std::error_code error;
+  const auto status = std::filesystem::status(path, error);
+  if (!std::filesystem::exists(status)) {
+    return error ? error.value() : ENOENT;
+  }
+  if (std::filesystem::is_directory(status)) {
+    return EISDIR;
+  }
+  return ::access(path.c_str(), R_OK) == 0 ? 0 : errno;
 }
 
-Owner<VEX> Load(const py::object& path, bool cache) {
-  const File file = FileOf(path);
+// Why one cannot be written, or 0: the library's text ends with the reason of the system.
+int ErrorOfWriting(std::string_view text) {
+  constexpr int kMany = 200;
+  for (int error = 1; error < kMany; ++error) {
+    if (text.ends_with(": " + std::generic_category().message(error))) {
+      return error;
+    }
+  }
+  return 0;
+}
+
+Owner<VEX> Load(const py::object& given, bool cache) {
+  const Path path(given);
   const LibraryLock lock;
   const SmartPointer<VEX> document(new VEX);
   try {
     const LibraryAlone library;
-    document->LoadXML(file, cache);
-  } catch (const Vexdoc::VexParseException&) {
-    throw;
+    document->LoadXML(File(path.bytes), cache);
   } catch (const Vexdoc::VexException& e) {
-    ThrowAs(file.IsAccessable(false) ? "ParseError" : "FileError", e);
+    if (const int error = ErrorOfReading(path.bytes)) {
+      ThrowFileError(error, path.name, &e);
+    }
+    if (dynamic_cast<const Vexdoc::VexParseException*>(&e) != nullptr) {
+      throw;
+    }
+    ThrowAs("ParseError", e);
   }
   return Owner<VEX>(document);
 }
@@ -59,8 +107,6 @@ Owner<VEX> Loads(const std::string& text) {
   try {
     const LibraryAlone library;
     document->Load(in);
-  } catch (const Vexdoc::VexParseException&) {
-    throw;
   } catch (const Vexdoc::VexException& e) {
     ThrowAs("ParseError", e);
   }
@@ -68,12 +114,16 @@ Owner<VEX> Loads(const std::string& text) {
 }
 
 // Keeps the interpreter: the locale of the process is another one meanwhile.
-void Save(const VEX& document, const py::object& path, bool cache) {
-  File file = FileOf(path);
+void Save(const VEX& document, const py::object& given, bool cache) {
+  const Path path(given);
   const LibraryLock lock;
   try {
+    File file(path.bytes);
     document.SaveXML(file, cache);
   } catch (const ResourceNotAvailableException& e) {
+    if (const int error = ErrorOfWriting(e.what())) {
+      ThrowFileError(error, path.name, &e);
+    }
     ThrowAs("FileError", e);
   }
 }
@@ -106,18 +156,31 @@ Owner<Attribute> Add(Sample& sample, Attribute* attribute) {
 
 Owner<Vexdoc::Spectrum> AddSpectrum(Sample& sample, const std::vector<float>& values,
                                     const Texts& texts) {
+  CheckFinite("values", values);
   const LibraryLock lock;
   Vexdoc::Conditions conditions = MakeSpectrumConditions(values.size());
   Apply(texts, conditions);
   return Add(sample, new Vexdoc::Spectrum(conditions, values));
 }
 
+// The library takes fewer, and then cannot read what it wrote.
+void CheckChannels(const std::string& space, std::size_t count) {
+  const std::size_t expected = CountChannels(space);
+  if (count != expected) {
+    const py::object labels = py::str(", ").attr("join")(LabelsOf(space));
+    throw py::value_error("values: expected " + std::to_string(expected) + " numbers for " + space +
+                          " (" + labels.cast<std::string>() + "), got " + std::to_string(count));
+  }
+}
+
 Owner<Vexdoc::ColorVector> AddColor(Sample& sample, const std::vector<float>& values,
                                     const std::string& space, const py::object& illuminant,
                                     const std::string& observer, const Texts& texts) {
+  CheckFinite("values", values);
   const LibraryLock lock;
   Vexdoc::Conditions conditions = MakeConditions({illuminant, observer}, space);
   Apply(texts, conditions);
+  CheckChannels(conditions.GetAttribute("ColorSpaceDescription.Type"), values.size());
   return Add(sample, new Vexdoc::ColorVector(conditions, values));
 }
 
@@ -144,12 +207,26 @@ void AddContainer(py::class_<Container, Owner<Container>>& type, const char* nam
     const LibraryLock lock;
     return Owner<Element>(self.FindElement(key));
   });
-  type.def("__contains__", [](const Container& self, const std::string& key) {
+  type.def("__getitem__", [](const Container& self, py::ssize_t index) {
     const LibraryLock lock;
     const auto& elements = self.GetElements();
-    return std::any_of(elements.begin(), elements.end(),
-                       [&key](const auto& entry) { return entry.first == key; });
+    const auto count = static_cast<py::ssize_t>(elements.size());
+    if (index < -count || index >= count) {
+      throw py::index_error(std::to_string(index) + " is no index of " + std::to_string(count));
+    }
+    return Owner<Element>(std::next(elements.begin(), index < 0 ? count + index : index)->second);
   });
+  const auto any = [](const Container& self, auto is_wanted) {
+    const LibraryLock lock;
+    return std::ranges::any_of(self.GetElements(), is_wanted);
+  };
+  type.def("__contains__", [any](const Container& self, const std::string& key) {
+    return any(self, [&](const auto& entry) { return entry.first == key; });
+  });
+  type.def("__contains__", [any](const Container& self, const Element& element) {
+    return any(self, [&](const auto& entry) { return entry.second.Get() == &element; });
+  });
+  type.def("__contains__", [](const Container&, const py::object&) { return false; });
   type.def("__delitem__", [](Container& self, const std::string& key) {
     const LibraryLock lock;
     self.RemoveElement(self.FindElement(key));
@@ -160,7 +237,8 @@ void AddContainer(py::class_<Container, Owner<Container>>& type, const char* nam
         const LibraryLock lock;
         return self.RenameElement(old_name, new_name);
       },
-      "rename(old, new)\n--\n\nReturns the new name, with a number behind it if it was taken.",
+      "rename(self, old, new)\n--\n\nReturns the new name, with a number behind it if it was "
+      "taken.",
       py::arg("old"), py::arg("new"));
 }
 
@@ -168,16 +246,22 @@ void AddContainer(py::class_<Container, Owner<Container>>& type, const char* nam
 template <class Container>
 void AddRows(py::class_<Container, Owner<Container>>& type) {
   using py::arg;
-  type.def("spectra", py::overload_cast<const Container&>(&SpectraOf), R"(spectra()
+  type.def("spectra",
+           py::overload_cast<const Container&, const std::optional<std::string>&>(&SpectraOf),
+           R"(spectra(self, *, type=None)
 --
 
 The first spectrum of every sample: SampleRows with `values` of shape (n, 36), `names` and `sets`.
 
-A sample without a spectrum of 36 values has a row of NaN.)");
+type: only spectra of this type, by their condition Physical.SpectrumType: "Remission" ...  Lights,
+    whose Colorimetric.Illumination is "Emission", are "Emission" whatever that condition says.
+
+A sample without such a spectrum of 36 values has a row of NaN.)",
+           py::kw_only(), arg("type") = py::none());
   type.def("colors",
            py::overload_cast<const Container&, const std::string&, const py::object&,
                              const std::string&, const py::object&>(&ColorsOf),
-           R"(colors(space="CIELab", *, illuminant="D50", observer="TwoDegree", paper=None)
+           R"(colors(self, space="CIELab", *, illuminant="D50", observer="TwoDegree", paper=None)
 --
 
 The colour of every sample: SampleRows with `values` of shape (n, channels), `names` and `sets`.
@@ -211,7 +295,7 @@ void AddSampleClass(py::module_& module) {
       },
       "The values of the first spectrum: float32, shape (36,) as a rule; a copy.");
   type.def("color", &ColorOf,
-           R"(color(space="CIELab", *, illuminant="D50", observer="TwoDegree", paper=None)
+           R"(color(self, space="CIELab", *, illuminant="D50", observer="TwoDegree", paper=None)
 --
 
 The colour of the sample: a stored one that was measured so, else one computed from the spectrum,
@@ -224,23 +308,28 @@ Returns float32, shape (channels,).
 Raises NotFoundError or MeasureError if the sample cannot give it.)",
            arg("space") = "CIELab", py::kw_only(), arg("illuminant") = "D50",
            arg("observer") = "TwoDegree", arg("paper") = py::none());
-  type.def("add_spectrum", &AddSpectrum, R"(add_spectrum(values, conditions={})
+  type.def("add_spectrum", &AddSpectrum, R"(add_spectrum(self, values, conditions={})
 --
 
 Adds a spectrum and returns it.
 
 values: numbers, 1 = perfect reflector; for colours there must be 36, at 380 nm to 730 nm.
-conditions: what is not said is a reflectance at these wavelengths.)",
+conditions: what is not said is a reflectance at these wavelengths; of a light,
+    Colorimetric.Illumination is "Emission".
+
+Raises ValueError for NaN and infinity, which no file keeps.)",
            arg("values"), arg("conditions") = Texts());
   type.def(
       "add_color", &AddColor,
-      R"(add_color(values, space="CIELab", *, illuminant="D50", observer="TwoDegree", conditions={})
+      R"(add_color(self, values, space="CIELab", *, illuminant="D50", observer="TwoDegree", conditions={})
 --
 
 Adds a colour and returns it.
 
 values: a number for each channel.
-conditions: further ones.)",
+conditions: further ones.
+
+Raises ValueError for another number of channels, and for NaN and infinity, which no file keeps.)",
       arg("values"), arg("space") = "CIELab", py::kw_only(), arg("illuminant") = "D50",
       arg("observer") = "TwoDegree", arg("conditions") = Texts());
 }
@@ -257,7 +346,7 @@ void AddSetClass(py::module_& module) {
         const LibraryLock lock;
         return Owner<Sample>(self.AddElement(name));
       },
-      R"(add_sample(name)
+      R"(add_sample(self, name)
 --
 
 Adds an empty sample and returns it; its name has a number behind it if `name` was taken.)",
@@ -273,7 +362,7 @@ void AddDocumentClass(py::module_& module) {
              const LibraryLock lock;
              return Owner<VEX>(new VEX(name));
            }),
-           arg("name") = "");
+           "__init__(self, name=\"\")\n--\n\nA document without sets.", arg("name") = "");
   AddHeader(type);
   AddContainer<VEX, SampleSet>(type, "sets");
   AddRows(type);
@@ -283,19 +372,23 @@ void AddDocumentClass(py::module_& module) {
         const LibraryLock lock;
         return Owner<SampleSet>(self.AddElement(name));
       },
-      R"(add_set(name)
+      R"(add_set(self, name)
 --
 
 Adds an empty set and returns it; its name has a number behind it if `name` was taken.)",
       arg("name"));
-  type.def("save", &Save, R"(save(path, cache=False)
+  type.def("save", &Save, R"(save(self, path, cache=False)
 --
 
 Writes the document as XML; with `cache`, a binary cache beside it too.
 
-The file is replaced as a whole, or stays as it was.  Raises FileError.)",
+Values are written with six significant digits.  The file is replaced as a whole, or stays as it
+was.  Raises FileError.)",
            arg("path"), arg("cache") = false);
-  type.def("dumps", &Dumps, "dumps()\n--\n\nThe document as XML in UTF-8.");
+  type.def("dumps", &Dumps, R"(dumps(self)
+--
+
+The document as XML in UTF-8, as `save` writes it: values have six significant digits.)");
 }
 
 }  // namespace

@@ -1,7 +1,9 @@
 #include "errors.h"
 
+#include <cerrno>
 #include <exception>
 #include <string>
+#include <system_error>
 
 #include <pybind11/pybind11.h>
 
@@ -33,16 +35,26 @@ py::object TextOf(const char* message) {
   return py::bytes(message).attr("decode")("utf-8", "replace");
 }
 
-void Set(const char* name, const TraceableException& failure) {
-  const py::object type = py::module_::import("aldermoor._errors").attr(name);
-  const py::object error = type(TextOf(failure.what()));
+py::object ClassOf(const char* name) {
+  return py::module_::import("aldermoor._errors").attr(name);
+}
+
+py::object MakeError(const char* name, const TraceableException& failure) {
+  const py::object error = ClassOf(name)(TextOf(failure.what()));
   error.attr("trace") = TraceOf(failure);
   if (const auto* place = dynamic_cast<const Vexdoc::VexXMLParseException*>(&failure)) {
-    error.attr("file") = TextOf(place->GetFile().c_str());
     error.attr("line") = place->GetLine();
     error.attr("column") = place->GetColumn();
   }
-  PyErr_SetObject(type.ptr(), error.ptr());
+  return error;
+}
+
+void Set(const py::object& error) {
+  PyErr_SetObject(py::type::of(error).ptr(), error.ptr());
+}
+
+void Set(const char* name, const TraceableException& failure) {
+  Set(MakeError(name, failure));
 }
 
 void Translate(std::exception_ptr thrown) {
@@ -51,6 +63,10 @@ void Translate(std::exception_ptr thrown) {
     std::rethrow_exception(thrown);
   } catch (const Exceptions::BadAllocException&) {
     PyErr_NoMemory();
+  } catch (const Vexdoc::VexXMLParseException& e) {
+    const py::object error = MakeError("ParseError", e);
+    error.attr("file") = TextOf(e.GetFile().c_str());
+    Set(error);
   } catch (const Vexdoc::VexParseException& e) {
     Set("ParseError", e);
   } catch (const Vexdoc::MissingConditionException& e) {
@@ -72,6 +88,16 @@ void Translate(std::exception_ptr thrown) {
 
 void ThrowAs(const char* name, const TraceableException& failure) {
   Set(name, failure);
+  throw py::error_already_set();
+}
+
+void ThrowFileError(int error, const py::object& path, const TraceableException* failure) {
+  const py::object made = ClassOf(error == ENOENT ? "MissingFileError" : "FileError")(
+      error, std::generic_category().message(error), path);
+  if (failure != nullptr) {
+    made.attr("trace") = TraceOf(*failure);
+  }
+  Set(made);
   throw py::error_already_set();
 }
 

@@ -2,11 +2,15 @@
 
 #include <algorithm>
 #include <charconv>
+#include <cmath>
 #include <limits>
+#include <map>
 #include <string_view>
 #include <vector>
 
 #include <pybind11/stl.h>
+
+#include "aldermoor/vexdoc/colorvector.h"
 
 namespace Aldermoor::Python {
 namespace {
@@ -49,6 +53,22 @@ void CheckWord(const char* argument, const std::string& word, const char* list) 
   }
 }
 
+// AddAttribute also counts the changes of shared blocks, in a number of the process that it writes
+// even where it adds nothing.
+void SetCondition(Vexdoc::Conditions& conditions, const std::string& key,
+                  const std::string& value) {
+  using Attributes = std::map<std::string, std::string>;
+  const_cast<Attributes&>(conditions.GetAttributes()).insert_or_assign(key, value);
+}
+
+void CheckFinite(const char* argument, std::span<const float> values) {
+  const auto odd = std::ranges::find_if_not(values, [](float v) { return std::isfinite(v); });
+  if (odd != values.end()) {
+    throw py::value_error(std::string(argument) + ": expected finite numbers, got " +
+                          std::to_string(*odd));
+  }
+}
+
 Bands ReadBands(const char* argument, const py::object& values) {
   std::vector<float> numbers;
   try {
@@ -62,6 +82,7 @@ Bands ReadBands(const char* argument, const py::object& values) {
     throw py::value_error(std::string(argument) + ": expected 36 numbers, got " +
                           std::to_string(numbers.size()));
   }
+  CheckFinite(argument, numbers);
   std::copy(numbers.begin(), numbers.end(), bands.begin());
   return bands;
 }
@@ -73,11 +94,11 @@ std::optional<Bands> ReadPaper(const py::object& paper) {
 Vexdoc::Conditions MakeConditions(const Viewing& viewing) {
   CheckWord("observer", viewing.observer, "OBSERVERS");
   Vexdoc::Conditions conditions;
-  conditions.AddAttribute("Colorimetric.Observer", viewing.observer);
-  if (py::isinstance<py::str>(viewing.illuminant)) {
-    conditions.AddAttribute(kIllumination, IlluminationOf(viewing.illuminant.cast<std::string>()));
+  SetCondition(conditions, "Colorimetric.Observer", viewing.observer);
+  if (viewing.HasNamedIlluminant()) {
+    SetCondition(conditions, kIllumination, IlluminationOf(viewing.illuminant.cast<std::string>()));
   } else {
-    conditions.AddAttribute(kIllumination, "Userdefined");
+    SetCondition(conditions, kIllumination, "Userdefined");
     conditions.SetCustomIllumination(MakeSpectrum(ReadBands("illuminant", viewing.illuminant)));
   }
   return conditions;
@@ -86,8 +107,18 @@ Vexdoc::Conditions MakeConditions(const Viewing& viewing) {
 Vexdoc::Conditions MakeConditions(const Viewing& viewing, const std::string& space) {
   CheckWord("space", space, "COLOR_SPACES");
   Vexdoc::Conditions conditions = MakeConditions(viewing);
-  conditions.AddAttribute("ColorSpaceDescription.Type", space);
+  SetCondition(conditions, "ColorSpaceDescription.Type", space);
   return conditions;
+}
+
+std::vector<std::string> LabelsOf(const std::string& space) {
+  const Vexdoc::Conditions conditions = MakeConditions({py::str("D50"), "TwoDegree"}, space);
+  const Vexdoc::ColorVector black(conditions, std::vector<float>(CountChannels(space)));
+  std::vector<std::string> labels;
+  for (const auto& [label, value] : black.GetDatastore()) {
+    labels.push_back(label);
+  }
+  return labels;
 }
 
 Vexdoc::Conditions MakeSpectrumConditions(std::size_t count) {

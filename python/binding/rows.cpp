@@ -19,12 +19,20 @@ std::string Text(const py::handle& object) {
   return py::str(object).cast<std::string>();
 }
 
+bool IsMasked(const py::object& array) {
+  return !py::type::of(array).is(py::module_::import("numpy").attr("ndarray")) &&
+         py::isinstance(array, py::module_::import("numpy.ma").attr("MaskedArray"));
+}
+
 // The array that `value` is.
 py::array FloatArray(const std::string& argument, const py::object& value,
                      const std::string& shape) {
   const std::string expected = argument + ": expected a NumPy array of float32 with shape " + shape;
   if (!py::isinstance<py::array>(value)) {
     throw py::type_error(expected + ", got " + Text(py::type::of(value).attr("__name__")));
+  }
+  if (IsMasked(value)) {
+    throw py::type_error(expected + ", got one with a mask; fill it with .filled(numpy.nan)");
   }
   auto array = py::reinterpret_borrow<py::array>(value);
   if (!py::isinstance<py::array_t<float>>(value)) {
@@ -108,7 +116,7 @@ py::array_t<float> MakeResult(const py::object& out, std::size_t count, bool sin
   if (!array.writeable() || (array.flags() & py::array::c_style) == 0 || !IsAligned(array)) {
     throw py::value_error("out: expected an array that is writeable and C-contiguous");
   }
-  return py::array_t<float>(array);
+  return py::reinterpret_borrow<py::array_t<float>>(array);  // itself, of whatever subclass
 }
 
 std::span<float> ValuesOf(py::array_t<float>& result) {

@@ -27,6 +27,19 @@ using Vexdoc::VEX;
 namespace {
 
 constexpr float kNaN = std::numeric_limits<float>::quiet_NaN();
+constexpr const char* kIllumination = "Colorimetric.Illumination";
+constexpr const char* kEmission = "Emission";
+
+// Colorimetry tells lights by their illumination alone, so that goes before the type.
+std::string TypeOf(const Vexdoc::Spectrum& spectrum) {
+  const auto& conditions = spectrum.GetConditions();
+  if (conditions.IsNull()) {
+    return "";
+  }
+  return conditions->GetAttribute(kIllumination, "") == kEmission
+             ? kEmission
+             : conditions->GetAttribute("Physical.SpectrumType", "");
+}
 
 Vexdoc::Conditions MakeRequest(const std::string& space, const Viewing& viewing,
                                const std::optional<Bands>& paper) {
@@ -42,14 +55,13 @@ Vexdoc::Conditions MakeRequest(const std::string& space, const Viewing& viewing,
 // and the colour of a light is its own.
 bool HoldsFor(const Vexdoc::Conditions& request, const Vexdoc::Conditions& own) {
   constexpr const char* kSpace = "ColorSpaceDescription.Type";
-  constexpr const char* kIllumination = "Colorimetric.Illumination";
   const std::string space = own.GetAttribute(kSpace, "");
   if (space == "RGB" || space == "CMYK") {
     return true;
   }
   const std::string illumination = own.GetAttribute(kIllumination, "");
   for (const auto& [key, wanted] : request.GetAttributes()) {
-    const bool is_own = key == kIllumination && illumination == "Emission";
+    const bool is_own = key == kIllumination && illumination == kEmission;
     if (key != kSpace && !is_own && own.GetAttribute(key, "") != wanted) {
       return false;
     }
@@ -130,11 +142,16 @@ class RowTable {
 };
 
 template <class Container>
-py::object SpectraTable(const Container& container) {
+py::object SpectraTable(const Container& container, const std::optional<std::string>& type) {
+  if (type) {
+    CheckWord("type", *type, "SPECTRUM_TYPES");
+  }
   RowTable table(kSpectrumBands);
   {
     const LibraryAlone library;
-    table.Fill(container, &SpectrumOf);
+    table.Fill(container, [&](const Sample& sample) -> const std::vector<float>& {
+      return SpectrumOf(sample, type);
+    });
   }
   return table.ToPython();
 }
@@ -144,7 +161,7 @@ py::object ColorsTable(const Container& container, const std::string& space,
                        const py::object& illuminant, const std::string& observer,
                        const py::object& paper) {
   const std::optional<Bands> paper_white = ReadPaper(paper);
-  RowTable table(space == "CMYK" ? 4 : 3);
+  RowTable table(CountChannels(space));
   const LibraryLock lock;
   const Vexdoc::Conditions request = MakeRequest(space, {illuminant, observer}, paper_white);
   {
@@ -164,9 +181,10 @@ FloatArray ToArray(const std::vector<float>& values) {
   return FloatArray(static_cast<py::ssize_t>(values.size()), values.data());
 }
 
-const std::vector<float>& SpectrumOf(const Sample& sample) {
+const std::vector<float>& SpectrumOf(const Sample& sample, const std::optional<std::string>& type) {
   for (const auto& [name, attribute] : sample.GetElements()) {
-    if (const auto* spectrum = dynamic_cast<const Vexdoc::Spectrum*>(attribute.Get())) {
+    const auto* const spectrum = dynamic_cast<const Vexdoc::Spectrum*>(attribute.Get());
+    if (spectrum != nullptr && (!type || TypeOf(*spectrum) == *type)) {
       return spectrum->GetData();
     }
   }
@@ -185,12 +203,12 @@ FloatArray ColorOf(const Sample& sample, const std::string& space, const py::obj
   return ToArray(FindColor(sample, request));
 }
 
-py::object SpectraOf(const VEX& document) {
-  return SpectraTable(document);
+py::object SpectraOf(const VEX& document, const std::optional<std::string>& type) {
+  return SpectraTable(document, type);
 }
 
-py::object SpectraOf(const SampleSet& set) {
-  return SpectraTable(set);
+py::object SpectraOf(const SampleSet& set, const std::optional<std::string>& type) {
+  return SpectraTable(set, type);
 }
 
 py::object ColorsOf(const VEX& document, const std::string& space, const py::object& illuminant,

@@ -1,13 +1,16 @@
 """Colorimetry on arrays, against published figures and against single samples."""
 
 import itertools
+from collections.abc import Callable
+from functools import partial
+from pathlib import Path
 
 import numpy
 import pytest
 from numpy.typing import NDArray
 
 import aldermoor
-from aldermoor._words import ColorSpace, Formula, Observer
+from aldermoor._words import ColorSpace, Formula, Observer, Spectra, SpectrumType
 
 Floats = NDArray[numpy.float32]
 PERFECT = numpy.ones((1, 36), numpy.float32)
@@ -69,6 +72,41 @@ def test_arrays_equal_samples_to_the_last_bit(
         assert not numpy.isnan(found).any()
 
 
+@pytest.mark.parametrize("paper", [None, numpy.linspace(0.8, 0.9, 36)])
+@pytest.mark.parametrize("illuminant", ["D50", "F11", "7000K", [1.0] * 36, "Emission"])
+def test_lights_equal_samples_to_the_last_bit(
+    spectra: Floats, illuminant: str | list[float], paper: NDArray[numpy.float64] | None
+) -> None:
+    document = aldermoor.Document()
+    samples = document.add_set("s")
+    shines = {"Colorimetric.Illumination": "Emission"}
+    emission = {"Physical.SpectrumType": "Emission"}
+    transmission = {"Physical.SpectrumType": "Transmission"}
+    kinds: list[dict[str, str]] = [{}, shines, shines | emission, transmission]
+    for values, conditions in zip(spectra, itertools.cycle(kinds)):
+        samples.add_sample("x").add_spectrum(values, conditions)
+    rows: dict[SpectrumType, list[int]] = {"Remission": [0], "Emission": [1, 2]}
+    sources: dict[SpectrumType, Spectra] = {"Remission": "Spectrum", "Emission": "Emission"}
+    for kind, source in sources.items():
+        values = document.spectra(type=kind).values
+        there = numpy.isin(numpy.arange(24) % 4, rows[kind])
+        numpy.testing.assert_array_equal(~numpy.isnan(values).any(axis=1), there)
+        if illuminant == "Emission" and kind != "Emission":
+            continue  # makes lights of what a document has as reflectances
+        for space in aldermoor.COLOR_SPACES:
+            if space != "CMYK":
+                expected = document.colors(space, illuminant=illuminant, paper=paper).values
+                expected[~there] = numpy.nan
+                found = aldermoor.convert(
+                    values, space, illuminant=illuminant, paper=paper, source=source
+                )
+                numpy.testing.assert_array_equal(found, expected, err_msg=f"{space} {kind}")
+    numpy.testing.assert_array_equal(
+        aldermoor.convert(spectra, illuminant="Emission", paper=paper),
+        aldermoor.convert(spectra, illuminant="Emission", paper=paper, source="Emission"),
+    )
+
+
 def test_colours_go_from_space_to_space(spectra: Floats) -> None:
     lab = aldermoor.convert(spectra, "CIELab")
     xyz = aldermoor.convert(lab, "CIEXYZ", source="CIELab")
@@ -118,10 +156,13 @@ def test_every_layout_gives_the_same(spectra: Floats) -> None:
     )
 
 
-def test_results_go_where_they_are_wanted(spectra: Floats) -> None:
+def test_results_go_where_they_are_wanted(spectra: Floats, tmp_path: Path) -> None:
     out = numpy.zeros((24, 3), numpy.float32)
     assert aldermoor.convert(spectra, out=out) is out
     numpy.testing.assert_array_equal(out, aldermoor.convert(spectra))
+    mapped = numpy.memmap(tmp_path / "out", numpy.float32, "w+", shape=(24, 3))
+    assert aldermoor.convert(spectra, out=mapped) is mapped
+    numpy.testing.assert_array_equal(mapped, out)
     differences = numpy.zeros(24, numpy.float32)
     assert aldermoor.delta_e(spectra, spectra[0], out=differences) is differences
     assert differences[0] == 0 and (differences[1:] > 0).all()
@@ -159,6 +200,49 @@ def test_what_cannot_be_computed_is_nan() -> None:
     assert (rendering.valid.tolist(), rendering.reference.tolist()) == ([False], [""])
     found = aldermoor.reconstruct(numpy.concatenate([row(50, 200, 200), row(50, 0, 0)]))
     assert numpy.isnan(found).all(axis=1).tolist() == [True, False]
+
+
+def rows_of_nan(values: Floats, band: int) -> Floats:
+    """`values` with a number missing in every second row."""
+    values = values.copy()
+    values[::2, band] = numpy.nan
+    return values
+
+
+@pytest.mark.parametrize("band", [0, 17, 35])
+def test_what_is_missing_has_no_result(spectra: Floats, band: int) -> None:
+    # White and black look like results for NaN: the numbers at the ends of their ranges.
+    spectra = numpy.concatenate([spectra, 9 * PERFECT, 9 * PERFECT, 0 * PERFECT, 0 * PERFECT])
+    missing = rows_of_nan(spectra, band)
+    functions: list[Callable[[Floats], Floats]] = [
+        *(partial(aldermoor.convert, space=s) for s in aldermoor.COLOR_SPACES if s != "CMYK"),
+        *(partial(aldermoor.density, standard=s) for s in aldermoor.DENSITY_STANDARDS),
+        *(partial(aldermoor.delta_e, PERFECT, formula=f) for f in aldermoor.FORMULAS),
+    ]
+    for function in functions:
+        expected = function(spectra)
+        assert not numpy.isnan(expected).any(), function
+        expected[::2] = numpy.nan
+        numpy.testing.assert_array_equal(function(missing), expected, err_msg=str(function))
+        assert numpy.isnan(function(missing[0])).all(), function
+
+
+@pytest.mark.parametrize("source", aldermoor.COLOR_SPACES)
+def test_colours_that_miss_a_channel_have_no_result(source: ColorSpace) -> None:
+    channels = len(aldermoor.channels(source))
+    colors = numpy.linspace(1, 90, 3000 * channels, dtype=numpy.float32).reshape(-1, channels)
+    for space, channel in itertools.product(aldermoor.COLOR_SPACES, range(channels)):
+        missing = rows_of_nan(colors, channel)
+        try:
+            expected = aldermoor.convert(colors, space, source=source)
+        except aldermoor.MeasureError:
+            continue
+        expected[::2] = numpy.nan
+        found = aldermoor.convert(missing, space, source=source)
+        numpy.testing.assert_array_equal(found, expected, err_msg=space)
+        if found.shape == missing.shape and channels == 3:
+            aldermoor.convert(missing, space, source=source, out=missing)
+            numpy.testing.assert_array_equal(missing, expected, err_msg=space)
 
 
 def test_densities_are_logarithms() -> None:

@@ -15,7 +15,14 @@ def test_a_document_is_walked_by_name_and_by_order(chart: aldermoor.Document) ->
     assert "chart" in chart and "chart 2" not in chart
     samples = chart["chart"]
     assert [s.name for s in samples][:2] == ["dark skin", "light skin"]
-    assert samples["red"] is samples.samples[14]
+    assert samples["red"] is samples.samples[14] is samples[14] is samples[-10]
+    assert samples[-24] is samples[0] and samples[23] is samples[-1]
+    for index in (-25, 24):
+        with pytest.raises(IndexError, match=f"{index} is no index of 24"):
+            samples[index]
+    assert all(sample in samples for sample in samples)
+    stranger = aldermoor.Document().add_set("s").add_sample("red")
+    assert not any(other in samples for other in (stranger, chart, 0, None, "\ud800"))
     assert chart.header["Geometry"] == "45/0"
     assert samples["red"].attributes[0].conditions["Physical.SpectrumType"] == "Remission"
 

@@ -1,5 +1,9 @@
 """Failures: the class, the text, the place."""
 
+import errno
+import math
+import os
+import pickle
 from collections.abc import Callable
 from pathlib import Path
 from typing import Any
@@ -14,6 +18,10 @@ ONES = numpy.ones((2, 36), numpy.float32)
 LAB = numpy.ones((2, 3), numpy.float32)
 # Arguments that no type checker lets through.
 ANY: Any = aldermoor
+
+
+def sample() -> aldermoor.Sample:
+    return aldermoor.Document().add_set("s").add_sample("e")
 
 
 @pytest.mark.parametrize(
@@ -48,20 +56,51 @@ ANY: Any = aldermoor
             "out: overlaps",
         ),
         (lambda: aldermoor.delta_e(ONES, ONES[[0, 0, 1]]), ValueError, "2 and 3 rows"),
-        (lambda: ANY.delta_e(ONES, ONES, "1976"), ValueError, "formula: '1976' is none of"),
-        (lambda: ANY.density(ONES, "User"), ValueError, "standard: 'User' is none of DIN"),
-        (lambda: aldermoor.reconstruct(LAB, "CIELCh"), ValueError, "source: 'CIELCh' is none of"),
-        (lambda: aldermoor.Document()["x"], aldermoor.NotFoundError, "SampleSet/x"),
         (
-            lambda: aldermoor.Document().add_set("s").add_sample("e").spectrum,
-            aldermoor.NotFoundError,
-            "'e' has no spectrum",
+            lambda: ANY.delta_e(LAB[:0], LAB[:0], "FMCII", source="CIEXYZ"),
+            aldermoor.MeasureError,
+            "FMCII",
         ),
         (
-            lambda: aldermoor.Document().add_set("s").add_sample("e").add_spectrum([1, 2]),
+            lambda: aldermoor.convert(ONES.view(numpy.ma.MaskedArray)),
+            TypeError,
+            r"values: .*mask; fill it with \.filled\(numpy\.nan\)",
+        ),
+        (lambda: aldermoor.density(ONES, paper=[0] * 36), ValueError, "paper: .*above 0"),
+        (lambda: ANY.delta_e(ONES, ONES, "1976"), ValueError, "formula: '1976' is none of"),
+        (lambda: ANY.density(ONES, "User"), ValueError, "standard: 'User' is none of DIN"),
+        (lambda: ANY.reconstruct(LAB, "CIELCh"), ValueError, "source: 'CIELCh' is none of"),
+        (lambda: aldermoor.Document()["x"], aldermoor.NotFoundError, "SampleSet/x"),
+        (lambda: sample().spectrum, aldermoor.NotFoundError, "'e' has no spectrum"),
+        (
+            lambda: sample().add_spectrum([1, 2]),
             aldermoor.MissingConditionError,
             "Physical.WavelengthSpectrumM",
         ),
+        # What a file would not give back.
+        (
+            lambda: sample().add_color([1, 2]),
+            ValueError,
+            r"expected 3 numbers for CIELab \(L\*, a\*, b\*\), got 2",
+        ),
+        (lambda: sample().add_color([1] * 6, "RGB"), ValueError, "for RGB .*, got 6"),
+        (lambda: sample().add_color([1] * 3, "CMYK"), ValueError, "expected 4 .*, got 3"),
+        (
+            lambda: sample().add_color([1] * 3, conditions={"ColorSpaceDescription.Type": "CMYK"}),
+            ValueError,
+            "for CMYK .*, got 3",
+        ),
+        (lambda: sample().add_color([1, 2, math.nan]), ValueError, "values: .*finite.*, got nan"),
+        (lambda: sample().add_spectrum([-math.inf] * 36), ValueError, "values: .*, got -inf"),
+        (lambda: sample().add_spectrum([1e300] * 36), ValueError, "values: .*, got inf"),
+        (
+            lambda: sample().add_color([1, 2, 3], illuminant=[math.nan] * 36),
+            ValueError,
+            "illuminant: .*, got nan",
+        ),
+        (lambda: aldermoor.Document()[0], IndexError, "0 is no index of 0"),
+        (lambda: ANY.Document().spectra(type="Light"), ValueError, "type: 'Light' is none of"),
+        (lambda: aldermoor.Sample(), TypeError, "No constructor"),  # type: ignore[call-arg]
     ],
 )
 def test_what_is_wrong_is_told(
@@ -85,14 +124,47 @@ def test_no_illegal_document_is_read(name: str) -> None:
         aldermoor.load(DATA / "illegal" / name)
 
 
-def test_files_that_cannot_be_used_have_an_error_of_the_system(tmp_path: Path) -> None:
-    attempts: list[Callable[[], object]] = [
-        lambda: aldermoor.load(tmp_path / "none.xml"),
-        lambda: aldermoor.load(tmp_path / "none" / "none.xml"),
-        lambda: aldermoor.Document().save(tmp_path / "none" / "x.xml"),
-    ]
-    for attempt in attempts:
-        with pytest.raises(OSError, match="none") as caught:
-            attempt()
-        assert isinstance(caught.value, aldermoor.FileError)
-        assert caught.value.trace
+def test_a_text_of_no_file_has_a_place_without_one() -> None:
+    with pytest.raises(aldermoor.ParseError) as caught:
+        aldermoor.loads("<a>\n<b></a>")
+    assert (caught.value.file, caught.value.line) == (None, 2)
+
+
+def load(path: str | Path) -> None:
+    aldermoor.load(path)
+
+
+def save(path: str | Path) -> None:
+    aldermoor.Document().save(path)
+
+
+@pytest.mark.parametrize("use", [load, save])
+@pytest.mark.parametrize(
+    ("name", "number"),
+    [
+        ("none/x.xml", errno.ENOENT),
+        ("file/x.xml", errno.ENOTDIR),
+        (".", errno.EISDIR),
+    ],
+)
+def test_files_that_cannot_be_used_have_an_error_of_the_system(
+    use: Callable[[str | Path], None], name: str, number: int, tmp_path: Path
+) -> None:
+    (tmp_path / "file").write_text("")
+    path = tmp_path / name
+    with pytest.raises(OSError) as caught:
+        use(path)
+    assert isinstance(caught.value, FileNotFoundError) == (number == errno.ENOENT)
+    assert isinstance(caught.value, aldermoor.FileError)
+    assert (caught.value.errno, caught.value.filename) == (number, str(path))
+    assert os.strerror(number) in str(caught.value) and caught.value.trace
+    again = pickle.loads(pickle.dumps(caught.value))
+    assert (type(again), str(again)) == (type(caught.value), str(caught.value))
+
+
+@pytest.mark.parametrize("use", [load, save])
+def test_paths_that_are_none_are_refused(use: Callable[[str | Path], None]) -> None:
+    with pytest.raises(FileNotFoundError):
+        use("")
+    with pytest.raises(ValueError, match="path: has a NUL"):
+        use("a\0b")

@@ -3,6 +3,7 @@
 import ast
 import inspect
 from pathlib import Path
+from types import MethodType
 from typing import Any
 
 import pytest
@@ -64,4 +65,10 @@ def test_classes_have_what_the_stubs_say(name: str) -> None:
     assert own == set(stub) | {"__init__"}
     for key, node in stub.items():
         if not key.startswith("__") and not node.decorator_list:
-            assert parameters(getattr(found, key)) == stub_parameters(node), key
+            function = getattr(found, key)
+            own_self, *others = parameters(function)
+            assert own_self[0] == "self", key
+            assert others == stub_parameters(node), key
+            # As the method of an object, whichever it is.
+            assert parameters(MethodType(function, object())) == stub_parameters(node), key
+        assert key.startswith("__") or getattr(found, key).__doc__, key

@@ -44,6 +44,36 @@ def test_the_interpreter_is_free_during_work(work: Callable[[], object]) -> None
     assert sum(start < turn < end for turn in turns) > 5
 
 
+# Each is tried several times while the other thread is certainly at work in the library, which it
+# is for seconds; to wait for it would be to end behind it.
+@pytest.mark.parametrize(
+    "work",
+    [
+        lambda: aldermoor.convert(SPECTRA[:10], illuminant="F7", paper=SPECTRA[0]),
+        lambda: aldermoor.convert(numpy.ones((9, 3), numpy.float32), "CIELCh", source="CIELab"),
+        lambda: aldermoor.delta_e(SPECTRA[:10], SPECTRA[1], illuminant="5400K"),
+        lambda: aldermoor.density(SPECTRA[:10]),
+    ],
+    ids=["convert", "convert colours", "delta_e", "density"],
+)
+def test_arrays_do_not_wait_for_the_library(work: Callable[[], object]) -> None:
+    events: list[str] = []
+
+    def occupy() -> None:
+        events.append("begin")
+        aldermoor.color_temperature(MANY[:60_000])
+        events.append("end")
+
+    thread = threading.Thread(target=occupy)
+    thread.start()
+    for _ in range(3):
+        time.sleep(0.05)
+        work()
+    events.append("worked")
+    thread.join()
+    assert events == ["begin", "worked", "end"]
+
+
 def build() -> bytes:
     document = aldermoor.Document("d")
     document.set_header("Created", "")
