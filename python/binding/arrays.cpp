@@ -51,15 +51,15 @@ struct Source {
     }
     Vexdoc::Conditions target = MakeConditions(view);
     if (paper_white) {
-      SetCondition(target, "Colorimetric.WhiteBase", "Paper");
+      target.AddAttribute("Colorimetric.WhiteBase", "Paper");
     }
     Vexdoc::Conditions own = IsSpectra() ? Vexdoc::Conditions() : Vexdoc::Conditions(target);
     if (IsLights()) {
-      SetCondition(own, "Colorimetric.Illumination", kLights);
+      own.AddAttribute("Colorimetric.Illumination", kLights);
     } else if (!IsSpectra()) {
-      SetCondition(own, "ColorSpaceDescription.Type", word);
+      own.AddAttribute("ColorSpaceDescription.Type", word);
     }
-    SetCondition(target, key, value);
+    target.AddAttribute(key, value);
     return Context(target, own, paper_white);
   }
 

@@ -4,7 +4,6 @@
 #include <charconv>
 #include <cmath>
 #include <limits>
-#include <map>
 #include <string_view>
 #include <vector>
 
@@ -53,14 +52,6 @@ void CheckWord(const char* argument, const std::string& word, const char* list) 
   }
 }
 
-// AddAttribute also counts the changes of shared blocks, in a number of the process that it writes
-// even where it adds nothing.
-void SetCondition(Vexdoc::Conditions& conditions, const std::string& key,
-                  const std::string& value) {
-  using Attributes = std::map<std::string, std::string>;
-  const_cast<Attributes&>(conditions.GetAttributes()).insert_or_assign(key, value);
-}
-
 void CheckFinite(const char* argument, std::span<const float> values) {
   const auto odd = std::ranges::find_if_not(values, [](float v) { return std::isfinite(v); });
   if (odd != values.end()) {
@@ -94,11 +85,11 @@ std::optional<Bands> ReadPaper(const py::object& paper) {
 Vexdoc::Conditions MakeConditions(const Viewing& viewing) {
   CheckWord("observer", viewing.observer, "OBSERVERS");
   Vexdoc::Conditions conditions;
-  SetCondition(conditions, "Colorimetric.Observer", viewing.observer);
+  conditions.AddAttribute("Colorimetric.Observer", viewing.observer);
   if (viewing.HasNamedIlluminant()) {
-    SetCondition(conditions, kIllumination, IlluminationOf(viewing.illuminant.cast<std::string>()));
+    conditions.AddAttribute(kIllumination, IlluminationOf(viewing.illuminant.cast<std::string>()));
   } else {
-    SetCondition(conditions, kIllumination, "Userdefined");
+    conditions.AddAttribute(kIllumination, "Userdefined");
     conditions.SetCustomIllumination(MakeSpectrum(ReadBands("illuminant", viewing.illuminant)));
   }
   return conditions;
@@ -107,7 +98,7 @@ Vexdoc::Conditions MakeConditions(const Viewing& viewing) {
 Vexdoc::Conditions MakeConditions(const Viewing& viewing, const std::string& space) {
   CheckWord("space", space, "COLOR_SPACES");
   Vexdoc::Conditions conditions = MakeConditions(viewing);
-  SetCondition(conditions, "ColorSpaceDescription.Type", space);
+  conditions.AddAttribute("ColorSpaceDescription.Type", space);
   return conditions;
 }
 

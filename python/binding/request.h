@@ -36,9 +36,6 @@ struct Viewing {
 /// aldermoor._words.
 void CheckWord(const char* argument, const std::string& word, const char* list);
 
-/// Sets a condition without the LibraryLock, if nobody else has these conditions.
-void SetCondition(Vexdoc::Conditions& conditions, const std::string& key, const std::string& value);
-
 /// Throws: ValueError that names `argument`, if a value is NaN or infinite.
 void CheckFinite(const char* argument, std::span<const float> values);
 

@@ -83,7 +83,12 @@ class ALDERMOOR_EXPORT Conditions final : public DeprecatedConditionsInterface<0
  private:
   friend class Internals::ConditionManager;
 
-  void NoteChange() { changes_of_shared_ += is_shared_ ? 1 : 0; }
+  /// Writes nothing for conditions of one's own, which other threads may build at the same time.
+  void NoteChange() {
+    if (is_shared_) {
+      ++changes_of_shared_;
+    }
+  }
 
   std::string id_;
   std::map<std::string, std::string> attributes_;
