@@ -116,13 +116,13 @@ void ConvertColors(const Context& context, std::span<const float> colors,
     const auto block = colors.subspan(from * begin, from * count);
     const auto results = converted.subspan(to * begin, to * count);
     std::bitset<kBlock> missing;
-    for (std::size_t i = 0; i < block.size(); ++i) {
-      if (IsNaN(block[i])) {
-        missing.set(i / from);
-      }
+    const bool is_complete =
+        std::ranges::count_if(block, IsNaN) == 0;  // quicker than to stop early
+    for (std::size_t row = 0; !is_complete && row < count; ++row) {
+      missing.set(row, std::ranges::any_of(block.subspan(from * row, from), IsNaN));
     }
     context.ConvertColors(block, results);
-    for (std::size_t row = 0; missing.any() && row < count; ++row) {
+    for (std::size_t row = 0; !is_complete && row < count; ++row) {
       if (missing.test(row)) {
         std::ranges::fill(results.subspan(to * row, to), kNaN);
       }
