@@ -9,6 +9,7 @@
 
 #include <gtest/gtest.h>
 
+#include "aldermoor/tristim/tristimexception.h"
 #include "aldermoor/utilities/exceptions/exceptions.h"
 #include "aldermoor/utilities/filesystem/directory.h"
 #include "aldermoor/vexdoc/colorspace.h"
@@ -72,6 +73,7 @@ TEST(ApiTest, ExceptionsKeepTheirTypesAcrossTheBorder) {
   EXPECT_THROW((void)document.GetSampleSet("a"), ResourceNotAvailableException);
   EXPECT_THROW(Spectrum(Conditions(), {}), MissingConditionException);
   EXPECT_THROW(ColorSpace("CIELab", ColorScheme::Channels()), VexParseException);
+  EXPECT_THROW(ColorSpace("CIELAB", std::vector<float>(3)), Tristim::TristimException);
   EXPECT_THROW(File(""), std::invalid_argument);
   EXPECT_THROW(Directory(Directory::Named, "/no/such/place"), TraceableException);
   EXPECT_THROW(document.SetParent(nullptr), std::logic_error);

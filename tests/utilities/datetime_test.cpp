@@ -82,6 +82,14 @@ TEST_F(DateTimeTest, FieldsFarOutOfRangeGiveTheirTimeOrNone) {
   }
 }
 
+TEST_F(DateTimeTest, FollowsAChangedTimeZone) {
+  EXPECT_EQ(DateTime(kWinterNoon).GetTime(), "12:00:00");
+  ::setenv("TZ", "Asia/Tokyo", 1);  // and nobody says tzset
+  EXPECT_EQ(DateTime(kWinterNoon).GetTime(), "20:00:00");
+  ::setenv("TZ", "UTC", 1);
+  EXPECT_EQ(DateTime(kWinterNoon).GetTime(), "11:00:00");
+}
+
 TEST_F(DateTimeTest, FormatsBelongToTheObjectAndGiveUpTo63Characters) {
   DateTime time(kWinterNoon);
   time.SetDateFormat("%d.%m.%Y");

@@ -13,8 +13,16 @@ using Utilities::Tools::SmartPointer;
 ColorScheme::ColorScheme(const Channels& data) try : data_(data) {}
 ALDERMOOR_FRAME(Aldermoor::Vexdoc::ColorScheme::ColorScheme)
 
-ColorScheme::ColorScheme(const ColorScheme&) = default;
-ColorScheme& ColorScheme::operator=(const ColorScheme&) = default;
+ColorScheme::ColorScheme(const ColorScheme& other) try : data_(other.data_) {}
+ALDERMOOR_FRAME(Aldermoor::Vexdoc::ColorScheme::ColorScheme)
+
+ColorScheme& ColorScheme::operator=(const ColorScheme& other) try {
+  Channels copy(other.data_);  // whole or not at all
+  data_.swap(copy);
+  return *this;
+}
+ALDERMOOR_FRAME(Aldermoor::Vexdoc::ColorScheme::operator=)
+
 ColorScheme::~ColorScheme() = default;
 
 SmartPointer<SampleAttribute> ColorScheme::TransformTo(const std::string& type,

@@ -16,7 +16,7 @@ class ALDERMOOR_EXPORT ColorSpace : public ColorScheme {
   /// Throws: VexParseException unless there are 4 for "CMYK" and 3 for any other colour space.
   ColorSpace(const std::string& colorSpace, const Channels& data);
   /// Labels the values in channel order, with the labels of absolute values.
-  /// Throws: TristimException (a RuntimeException) for an unknown colour space; VexParseException
+  /// Throws: Tristim::TristimException for an unknown colour space; VexParseException
   /// for more values than it has labels.
   ColorSpace(const std::string& colorSpace, const std::vector<float>& values);
   ColorSpace(const ColorSpace& other);

@@ -27,7 +27,7 @@ class ALDERMOOR_EXPORT ColorVector : public AbstractSampleAttribute {
   /// MissingConditionException; ResourceNotAvailableException if the conditions name no type.
   ColorVector(const Conditions& conditions, const std::vector<std::pair<std::string, float>>& data);
   /// Labels the values in channel order.  The colour space must be a known one.
-  /// Throws: TristimException (a RuntimeException) for an unknown one; VexParseException for more
+  /// Throws: Tristim::TristimException for an unknown one; VexParseException for more
   /// values than it has labels; MissingConditionException; ResourceNotAvailableException if the
   /// conditions name no type.
   ColorVector(const Conditions& conditions, const std::vector<float>& values);

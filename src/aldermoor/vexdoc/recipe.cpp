@@ -30,9 +30,27 @@ Recipe::Recipe(const Conditions& conditions, const std::string& assortmentName,
       components_(components) {}
 ALDERMOOR_FRAME(Aldermoor::Vexdoc::Recipe::Recipe)
 
-Recipe::Recipe(const Recipe&) = default;
+Recipe::Recipe(const Recipe& other) try
+    : AbstractSampleAttribute(other),
+      assortment_name_(other.assortment_name_),
+      thickness_(other.thickness_),
+      substrate_link_name_(other.substrate_link_name_),
+      components_(other.components_) {}
+ALDERMOOR_FRAME(Aldermoor::Vexdoc::Recipe::Recipe)
 
-Recipe& Recipe::operator=(const Recipe&) = default;
+// Whole or not at all, as every assignment here: what can fail comes first.
+Recipe& Recipe::operator=(const Recipe& other) try {
+  if (this != &other) {
+    Recipe copy(other);
+    AbstractSampleAttribute::operator=(other);
+    assortment_name_.swap(copy.assortment_name_);
+    thickness_ = copy.thickness_;
+    substrate_link_name_.swap(copy.substrate_link_name_);
+    components_.swap(copy.components_);
+  }
+  return *this;
+}
+ALDERMOOR_FRAME(Aldermoor::Vexdoc::Recipe::operator=)
 
 Recipe::~Recipe() = default;
 
@@ -85,7 +103,10 @@ std::string Recipe::GetSubstrateLinkName() const {
   return substrate_link_name_;
 }
 
-void Recipe::SetComponents(const Components& components) try { components_ = components; }
+void Recipe::SetComponents(const Components& components) try {
+  Components copy(components);  // whole or not at all
+  components_.swap(copy);
+}
 ALDERMOOR_FRAME(Aldermoor::Vexdoc::Recipe::SetComponents)
 
 const Recipe::Components& Recipe::GetComponents() const {

@@ -28,12 +28,15 @@ Spectrum::Spectrum(const Conditions& conditions, const std::vector<float>& data)
 }
 ALDERMOOR_FRAME(Aldermoor::Vexdoc::Spectrum::Spectrum)
 
-Spectrum::Spectrum(const Spectrum&) = default;
+Spectrum::Spectrum(const Spectrum& other) try
+    : AbstractSampleAttribute(other), data_(other.data_) {}
+ALDERMOOR_FRAME(Aldermoor::Vexdoc::Spectrum::Spectrum)
 
 Spectrum& Spectrum::operator=(const Spectrum& other) try {
   if (this != &other) {
+    std::vector<float> data(other.data_);  // first, since it can fail
     AbstractSampleAttribute::operator=(other);
-    data_ = other.data_;
+    data_.swap(data);
   }
   return *this;
 }

@@ -2,9 +2,11 @@
 
 #include <array>
 #include <cstddef>
+#include <cstdlib>
 #include <ctime>
 #include <limits>
 #include <sstream>
+#include <string_view>
 #include <vector>
 
 #include "aldermoor/utilities/exceptions/frame.h"
@@ -29,6 +31,20 @@ bool ReadThree(const std::string& text, char delimiter, std::array<long, 3>& num
     }
   }
   return true;
+}
+
+// localtime_r reads the time zone once for a process; an application may choose another one later.
+// Only a changed TZ is read again, since that looks at files and every new element asks for a date.
+void ReadChangedTimeZone() {
+  thread_local std::string known;
+  thread_local bool was_read = false;
+  const char* const zone = std::getenv("TZ");
+  const std::string_view present = zone == nullptr ? std::string_view("\n", 1) : zone;
+  if (!was_read || present != known) {
+    tzset();
+    known = present;
+    was_read = true;
+  }
 }
 
 // The time of calendar fields in standard time; 0 if there is none.
@@ -114,6 +130,7 @@ std::string DateTime::Format(const std::string& format) const try {
   }
   const std::time_t time = time_;
   std::tm fields{};
+  ReadChangedTimeZone();
   if (localtime_r(&time, &fields) == nullptr) {
     return "";  // a year that does not fit the calendar fields
   }
