@@ -558,10 +558,34 @@ HWY_INLINE F Hues(const Lab& lab) {
   return hn::Load(kF, a.data());
 }
 
+/// `function` of numbers, NaN of NaN.  The emulated vectors convert a NaN to an integer on the way,
+/// which C++ leaves undefined.
+template <class Function>
+HWY_INLINE D OfNumbers(Function function, D v) {
+#if HWY_TARGET == HWY_EMU128
+  const auto is_nan = hn::IsNaN(v);
+  return hn::IfThenElse(is_nan, v, function(kD, hn::IfThenElse(is_nan, hn::Zero(kD), v)));
+#else
+  return function(kD, v);
+#endif
+}
+
+HWY_INLINE D Sine(D v) {
+  return OfNumbers([](auto d, D x) HWY_ATTR { return hn::Sin(d, x); }, v);
+}
+
+HWY_INLINE D Cosine(D v) {
+  return OfNumbers([](auto d, D x) HWY_ATTR { return hn::Cos(d, x); }, v);
+}
+
+HWY_INLINE D Exponential(D v) {
+  return OfNumbers([](auto d, D x) HWY_ATTR { return hn::Exp(d, x); }, v);
+}
+
 /// The wave of CMC in a half of the lanes: base + |amplitude · cos|.
 HWY_INLINE D CmcWave(D doubled_degrees, D base, D amplitude) {
   const D angle = hn::Mul(doubled_degrees, hn::Set(kD, std::numbers::pi / 360.0));
-  return hn::Add(base, hn::Abs(hn::Mul(amplitude, hn::Cos(kD, angle))));
+  return hn::Add(base, hn::Abs(hn::Mul(amplitude, Cosine(angle))));
 }
 
 void DeltaECmcImpl(const Colors& first, const Colors& second, float weight_l, float weight_c,
@@ -677,13 +701,12 @@ HWY_INLINE Bounded SquareOf2000(const LabD& first, const LabD& second, D delta_l
   // The mean, half a turn further if the short way leads over 0.
   const D h = hn::Add(hn::Mul(hn::Add(h1, h2), half), hn::IfThenElse(is_over, pi, zero));
 
-  const D dh =
-      hn::Mul(hn::Mul(set(2.0), hn::Sqrt(hn::Mul(c1, c2))), hn::Sin(kD, hn::Mul(delta_h, half)));
+  const D dh = hn::Mul(hn::Mul(set(2.0), hn::Sqrt(hn::Mul(c1, c2))), Sine(hn::Mul(delta_h, half)));
   const D mean = hn::Mul(hn::Add(c1, c2), half);
 
   // The four waves from one sine and cosine.
-  const D s = hn::Sin(kD, h);
-  const D c = hn::Cos(kD, h);
+  const D s = Sine(h);
+  const D c = Cosine(h);
   const D s_2 = hn::Mul(set(2.0), hn::Mul(s, c));
   const D c_2 = hn::MulSub(hn::Mul(set(2.0), c), c, unit);
   const D s_3 = hn::MulAdd(s_2, c, hn::Mul(c_2, s));
@@ -711,8 +734,8 @@ HWY_INLINE Bounded SquareOf2000(const LabD& first, const LabD& second, D delta_l
   const D sh = hn::MulAdd(hn::Mul(set(0.015), mean), t, unit);
   constexpr double kDegrees = 180.0 / std::numbers::pi;
   const D from_blue = hn::Mul(hn::MulSub(h, set(kDegrees), set(275.0)), set(1.0 / 25.0));
-  const D theta = hn::Mul(set(60.0 / kDegrees), hn::Exp(kD, hn::Neg(SquaredD(from_blue))));
-  const D rt = hn::Mul(hn::Neg(hn::Sin(kD, theta)), hn::Mul(set(2.0), ChromaShare(mean)));
+  const D theta = hn::Mul(set(60.0 / kDegrees), Exponential(hn::Neg(SquaredD(from_blue))));
+  const D rt = hn::Mul(hn::Neg(Sine(theta)), hn::Mul(set(2.0), ChromaShare(mean)));
   const D x = hn::Div(delta_l, hn::Mul(set(weights[0]), sl));
   const D y = hn::Div(hn::Sub(c2, c1), hn::Mul(set(weights[1]), sc));
   const D z = hn::Div(dh, hn::Mul(set(weights[2]), sh));
