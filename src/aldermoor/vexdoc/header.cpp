@@ -24,7 +24,8 @@ ALDERMOOR_FRAME(Aldermoor::Vexdoc::Header::Header)
 
 Header& Header::operator=(const Header& other) try {
   if (this != &other) {
-    attributes_ = other.attributes_;
+    std::map<std::string, std::string> attributes(other.attributes_);
+    attributes_.swap(attributes);
   }
   return *this;
 }

@@ -32,7 +32,18 @@ ALDERMOOR_FRAME(Aldermoor::Vexdoc::Recipe::Recipe)
 
 Recipe::Recipe(const Recipe&) = default;
 
-Recipe& Recipe::operator=(const Recipe&) = default;
+Recipe& Recipe::operator=(const Recipe& other) try {
+  if (this != &other) {
+    Recipe copy(other);  // first, for memory may be short
+    AbstractSampleAttribute::operator=(other);
+    assortment_name_.swap(copy.assortment_name_);
+    thickness_ = copy.thickness_;
+    substrate_link_name_.swap(copy.substrate_link_name_);
+    components_.swap(copy.components_);
+  }
+  return *this;
+}
+ALDERMOOR_FRAME(Aldermoor::Vexdoc::Recipe::operator=)
 
 Recipe::~Recipe() = default;
 
@@ -85,7 +96,10 @@ std::string Recipe::GetSubstrateLinkName() const {
   return substrate_link_name_;
 }
 
-void Recipe::SetComponents(const Components& components) try { components_ = components; }
+void Recipe::SetComponents(const Components& components) try {
+  Components copy(components);  // first, for memory may be short
+  components_.swap(copy);
+}
 ALDERMOOR_FRAME(Aldermoor::Vexdoc::Recipe::SetComponents)
 
 const Recipe::Components& Recipe::GetComponents() const {

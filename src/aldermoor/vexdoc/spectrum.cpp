@@ -32,8 +32,9 @@ Spectrum::Spectrum(const Spectrum&) = default;
 
 Spectrum& Spectrum::operator=(const Spectrum& other) try {
   if (this != &other) {
+    std::vector<float> data(other.data_);  // first, for memory may be short
     AbstractSampleAttribute::operator=(other);
-    data_ = other.data_;
+    data_.swap(data);
   }
   return *this;
 }
