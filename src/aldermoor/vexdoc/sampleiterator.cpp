@@ -36,15 +36,6 @@ bool SampleIterator::HasNext() const {
   return place_.samples != nullptr && place_.sample != place_.samples->end();
 }
 
-// The entry of the set of `place`, which is another one after an exchange of sets.
-SampleIterator::SampleSets::const_iterator SampleIterator::FindSet(const Place& place) const {
-  const auto holds_samples = [&place](const auto& entry) {
-    return &entry.second->GetSamples() == place.samples;
-  };
-  return holds_samples(*place.set) ? place.set
-                                   : std::find_if(sets_->begin(), sets_->end(), holds_samples);
-}
-
 bool SampleIterator::IsFilterMatching(const Sample& sample) const try {
   if (filter_.IsEmpty() && type_.empty()) {
     return true;
@@ -63,11 +54,8 @@ SampleIterator::Place SampleIterator::Front(SampleSets::const_iterator set) {
 }
 
 SampleIterator::Place SampleIterator::FrontOfNextSet(const Place& place) const {
-  auto set = is_confined_ ? sets_->end() : FindSet(place);
-  if (set == sets_->end() || ++set == sets_->end()) {
-    return {};
-  }
-  return Front(set);
+  const auto set = is_confined_ ? sets_->end() : std::next(place.set);
+  return set == sets_->end() ? Place() : Front(set);
 }
 
 // Moves `place` to the first match from there on, or behind all.  A failure leaves it where the
@@ -115,7 +103,7 @@ void SampleIterator::DeprecatedDelete() try {
       // The sample is to go all the same.
     }
   }
-  FindSet(place_)->second->RemoveElement(place_.sample);
+  place_.set->second->RemoveElement(place_.sample);
   place_ = next;
 }
 ALDERMOOR_FRAME(Aldermoor::Vexdoc::SampleIterator::DeprecatedDelete)

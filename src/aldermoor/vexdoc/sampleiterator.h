@@ -89,7 +89,6 @@ class ALDERMOOR_EXPORT SampleIterator final : public SampleIteratorDeprecated<0>
     SampleSets::const_iterator set;
   };
 
-  SampleSets::const_iterator FindSet(const Place& place) const;
   bool IsFilterMatching(const Sample& sample) const;
   static Place Front(SampleSets::const_iterator set);
   Place FrontOfNextSet(const Place& place) const;

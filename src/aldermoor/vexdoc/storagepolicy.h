@@ -4,6 +4,7 @@
 #include <algorithm>
 #include <charconv>
 #include <functional>
+#include <iterator>
 #include <list>
 #include <map>
 #include <string>
@@ -40,10 +41,20 @@ typename ElementList<T>::value_type& EntryAt(ElementList<T>& list,
   return *list.erase(position, position);
 }
 
+/// Exchanges the places of two entries.  The entries themselves move, and positions with them.
 template <class T>
 void SwapEntries(ElementList<T>& list, typename ElementList<T>::const_iterator first,
                  typename ElementList<T>::const_iterator second) noexcept {
-  std::swap(EntryAt<T>(list, first), EntryAt<T>(list, second));
+  if (first == second) {
+    return;
+  }
+  const auto behind = std::next(first);
+  list.splice(second, list, first);
+  if (behind != second) {
+    list.splice(behind, list, second);
+  } else {
+    list.splice(first, list, second);
+  }
 }
 
 /// A name of the form "Red (1)", taken apart; `number` is 0 for any other.

@@ -213,7 +213,7 @@ std::string VEX::InsertSample(const Sample& sample, SampleIterator& position) tr
     throw VexException("SampleIterator not valid",
                        ALDERMOOR_HERE(Aldermoor::Vexdoc::VEX::InsertSample));
   }
-  return position.FindSet(position.place_)->second->InsertSample(sample, position);
+  return position.place_.set->second->InsertSample(sample, position);
 }
 ALDERMOOR_FRAME(Aldermoor::Vexdoc::VEX::InsertSample)
 

@@ -70,7 +70,7 @@ class VexNode : public Header {
   /// that was free before the old one was given up.
   /// Throws: ResourceNotAvailableException if there is no element `oldName`.
   std::string RenameElement(const std::string& oldName, const std::string& newName);
-  /// Exchanges the places of two elements; a position stays at its place.
+  /// Exchanges the places of two elements; positions go with the elements on which they stand.
   /// Throws: VexException if one of them is missing.
   void SwapElements(const std::string& first, const std::string& second);
 
