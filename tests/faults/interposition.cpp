@@ -83,6 +83,7 @@ Outcome RunWith(const Fault& fault, const std::function<void()>& operation) {
     outcome.is_traceable = dynamic_cast<const Utilities::Exceptions::TraceableException*>(&e);
     outcome.message = e.what();
   }
+  outcome.calls = calls;
   return outcome;
 }
 

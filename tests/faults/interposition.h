@@ -22,6 +22,7 @@ struct Fault {
 
 struct Outcome {
   bool was_reached = false;  ///< there was a call of that number
+  long calls = 0;            ///< of those that may fail
   std::string call;
   int error = 0;  ///< that it got; none if it has no error of that variant
   bool has_failed = false;

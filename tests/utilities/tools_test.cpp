@@ -1,4 +1,6 @@
+#include <functional>
 #include <string>
+#include <utility>
 #include <vector>
 
 #include <gtest/gtest.h>
@@ -57,6 +59,20 @@ TEST(TreeTest, ACopySharesTheChildrenAndBecomesTheirParent) {
   EXPECT_EQ(root.GetChildren().front()->GetParent(), &copy);
 }
 
+TEST(TreeTest, MayBecomeOneOfItsOwnChildren) {
+  Tree<Item> root(Item{1});
+  for (const int number : {2, 3}) {
+    Tree<Item> child(Item{number});
+    child.AddChild(Tree<Item>(Item{10 * number}));
+    root.AddChild(child);
+  }
+  root = *root.GetChildren().front();
+  EXPECT_EQ(root.number, 2);
+  ASSERT_EQ(root.GetChildren().size(), 1U);
+  EXPECT_EQ(root.GetChildren().front()->number, 20);
+  EXPECT_EQ(root.GetChildren().front()->GetParent(), &root);
+}
+
 /// Counts its living objects; may own further ones.
 struct Link {
   Link() { ++alive; }
@@ -89,6 +105,46 @@ TEST(SmartPointerTest, TheLastOneDeletesTheObjectOnce) {
     EXPECT_EQ(last.UseCount(), 2);
   }
   EXPECT_EQ(Link::alive, 0);
+}
+
+TEST(SmartPointerTest, WhatIsAssignedMayLiveInWhatIsGivenUp) {
+  using Pointer = SmartPointer<Link>;
+  const auto list = [] {
+    Pointer first(new Link);
+    first->next = Pointer(new DerivedLink);
+    first->next->next = Pointer(new Link);
+    return first;
+  };
+  const std::function<void(Pointer&)> assignments[] = {
+      [](Pointer& node) { node = node->next; },
+      [](Pointer& node) { node = std::move(node->next); },
+  };
+  for (const auto& assign : assignments) {
+    Pointer node = list();
+    for (int left = 3; left > 0; --left) {
+      EXPECT_EQ(Link::alive, left);
+      assign(node);
+    }
+    EXPECT_TRUE(node == nullptr);
+  }
+  Pointer circle = list();
+  circle->next->next->next = circle;
+  circle->next->next->next = 0;  // the source of the value goes with the last owner but one
+  EXPECT_EQ(Link::alive, 3);
+  Link& last = *circle->next->next;
+  last.next = circle;
+  circle = 0;
+  last.next = nullptr;  // the pointer itself lives in what it gives up
+  EXPECT_EQ(Link::alive, 0);
+}
+
+TEST(SmartPointerTest, IsComparedByItsObject) {
+  const SmartPointer<DerivedLink> derived(new DerivedLink);
+  const SmartPointer<Link> base = derived;
+  const SmartPointer<Link> none = nullptr;
+  EXPECT_TRUE(base == derived && derived == base && none == nullptr && nullptr == none);
+  EXPECT_TRUE(base != none && none != derived && nullptr != base);
+  EXPECT_FALSE(base == SmartPointer<Link>(new Link));
 }
 
 TEST(SmartPointerTest, ADowncastSharesTheCountAndZeroGivesItUp) {

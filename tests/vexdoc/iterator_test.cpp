@@ -121,6 +121,72 @@ TEST(SampleIteratorTest, InsertionComesBeforeThePositionWhichThenMovesOn) {
   EXPECT_EQ(MessageOf<VexException>([&] { set->InsertSample(Sample(), other); }), invalid);
 }
 
+TEST(SampleIteratorTest, KeepsToItsSetWhateverComesAndGoesBehindIt) {
+  VEX document = Document();
+  std::string names;
+  for (const auto& sample : document.GetFirstSample("b")) {
+    names += sample->GetName();
+    document.AddSample("new " + std::to_string(names.size()), Sample("x"));
+    ASSERT_LT(names.size(), 5U) << "the walk must not run into what it adds";
+  }
+  EXPECT_EQ(names, "45");
+  SampleIterator position = document.GetFirstSample("a");
+  document.InsertSampleSet("between", 2);
+  document.AddSample("between", Sample("y"));
+  document.RemoveSampleSet("none");
+  for (int i = 0; i < 9; ++i) {
+    position.DeprecatedDelete();
+  }
+  EXPECT_EQ(Walk(document.GetFirstSample("")), "y45xx") << "only the walk's own samples may go";
+  position = document.GetFirstSample("between");
+  document.RemoveSampleSet("b");
+  EXPECT_EQ(Walk(position), "y");
+  ++position;
+  document.RemoveSampleSet("between");
+  EXPECT_FALSE((++position).HasNext()) << "it is over and needs no set any more";
+}
+
+TEST(SampleIteratorTest, StandsOnItsSampleWhileNamesAndPlacesChange) {
+  VEX document = Document();
+  SampleIterator position = document.GetFirstSample("");
+  document.RenameSampleSet("a", "b");  // taken
+  document.RenameSample("b (1)", "1", "2");
+  EXPECT_EQ(position.Dereference()->GetName(), "2 (1)");
+  document.SwapSample("b (1)", "2 (1)", "2");
+  document.SwapElements("b (1)", "none");
+  document.RemoveSampleSet("none");
+  EXPECT_EQ(Walk(position), "2 (1)345");
+  int renamed = 0;
+  for (const auto& entry : document.GetSampleSets()) {
+    for (const auto& [key, sample] : entry.second->GetSamples()) {
+      document.RenameSample(entry.first, key, "sample");
+      renamed += sample->GetName().starts_with("sample") ? 1 : 0;
+    }
+  }
+  EXPECT_EQ(renamed, 5);
+}
+
+TEST(SampleIteratorTest, OfAnotherDocumentIsNotValid) {
+  VEX document = Document();
+  VEX other = Document();
+  SampleIterator position = other.GetFirstSample("a");
+  EXPECT_EQ(MessageOf<VexException>([&] { document.InsertSample(Sample("x"), position); }),
+            "SampleIterator not valid");
+  EXPECT_EQ(Walk(other.GetFirstSample("")) + Walk(document.GetFirstSample("")), "1234512345");
+  EXPECT_EQ(position.Dereference()->GetName(), "1");
+}
+
+TEST(SampleAttributeIteratorTest, ServesALoop) {
+  Sample sample = Attributes();
+  std::string names;
+  for (const auto& attribute : sample.GetFirstSampleAttribute(kLab)) {
+    names += attribute->GetName();
+    sample.RenameElement(attribute->GetName(), "x");
+  }
+  EXPECT_EQ(names, "bd");
+  EXPECT_EQ(Walk(sample.GetFirstSampleAttribute()), "axcx");
+}
+
 TEST(SampleAttributeIteratorTest, StopsAtTheMatchesOfItsFilter) {
   const Sample sample = Attributes();
   EXPECT_EQ(Walk(sample.GetFirstSampleAttribute()), "abcd");

@@ -1,13 +1,17 @@
 #include "aldermoor/vexdoc/vexnode.h"
 
+#include <functional>
 #include <iterator>
+#include <limits>
 #include <string>
+#include <utility>
 
 #include <gtest/gtest.h>
 
 #include "aldermoor/vexdoc/internals/documentaccess.h"
 #include "aldermoor/vexdoc/recipe.h"
 #include "aldermoor/vexdoc/sampleset.h"
+#include "aldermoor/vexdoc/vex.h"
 #include "aldermoor/vexdoc/vexexception.h"
 
 #include "tests/vexdoc/support.h"
@@ -16,6 +20,7 @@ namespace Aldermoor::Vexdoc::Tests {
 namespace {
 
 using Internals::DocumentAccess;
+using Utilities::Exceptions::OutOfRangeException;
 
 const std::string kSampleType = "class Aldermoor::Vexdoc::Sample";
 
@@ -154,6 +159,95 @@ TEST(VexNodeTest, OnlyInsertionAndRemovalCountAsAModification) {
   EXPECT_FALSE(modifies([](SampleSet& s) { s.FindElement("x", true); }));
   EXPECT_FALSE(modifies([](SampleSet& s) { DocumentAccess::Append(s, NewSample("x")); }));
   EXPECT_FALSE(modifies([](SampleSet& s) { s.Clear(); }));
+}
+
+TEST(VexNodeTest, AnIndexOutOfRangeChangesNothing) {
+  for (const long index : {-1L, 3L, 1'000'000'000'000L, std::numeric_limits<long>::min()}) {
+    VEX document;
+    document.AddSample("set", Sample("a"));
+    document.AddSampleSet("other");
+    const std::string message = "position " + std::to_string(index) + " is outside 0..";
+    const std::pair<std::function<void()>, const char*> insertions[] = {
+        {[&] { document.InsertSampleSet("x", index); }, "2"},
+        {[&] { document.InsertSampleSet(SampleSet("x"), index); }, "2"},
+        {[&] { document.InsertElement("x", index); }, "2"},
+        {[&] { document.InsertSample("set", Sample("x"), index); }, "1"},
+        {[&] { document.InsertSample("new", Sample("x"), index); }, "0"},
+    };
+    for (const auto& [insert, count] : insertions) {
+      EXPECT_EQ(MessageOf<OutOfRangeException>(insert), message + count);
+    }
+    EXPECT_EQ(KeysOf(document.GetElements()), Keys({"set", "other"}));
+    ExpectSamples(*document.GetSampleSet("set"), {"a"});
+  }
+}
+
+// An element that refuses what a container asks of it.
+struct Stubborn : Sample {
+  explicit Stubborn(const std::string& name) : Sample(name) {}
+  void SetName(const std::string& /*name*/) override { throw VexException("no", ""); }
+  void SetParent(Header* parent) override {
+    if (parent != nullptr && refuses_parents) {
+      throw VexException("no", "");
+    }
+  }
+  bool refuses_parents = false;
+};
+
+TEST(VexNodeTest, AnElementThatRefusesLeavesTheContainerAsItWas) {
+  SampleSet set = SetOf({"a"});
+  set.SetAttribute("Modified", "long ago");
+  const SmartPointer<Stubborn> stubborn(new Stubborn("a"));
+  EXPECT_THROW(set.AddElement(stubborn), VexException) << "it needs another name";
+  stubborn->refuses_parents = true;
+  EXPECT_THROW(set.AddElement(stubborn), VexException);
+  EXPECT_THROW(set.AddElement(SmartPointer<Sample>()), NullPointerException);
+  ExpectSamples(set, {"a"});
+  EXPECT_EQ(set.GetModificationDateTime(), "long ago");
+  stubborn->refuses_parents = false;
+  set.RemoveElement("a");
+  set.AddElement(stubborn);
+  EXPECT_THROW(set.RenameElement("a", "b"), VexException);
+  ExpectSamples(set, {"a"});
+}
+
+TEST(VexNodeTest, OfEqualNamesTheNextIsFoundWhenTheFirstGoes) {
+  const std::function<void(SampleSet&)> ways[] = {
+      [](SampleSet& set) { set.RemoveElement("a"); },
+      [](SampleSet& set) { set.RemoveElement(set.GetElement("a")); },
+      [](SampleSet& set) { set.RenameElement("a", "c"); },
+  };
+  for (const auto& way : ways) {
+    SampleSet set;
+    for (const char* name : {"a", "b", "a", "a"}) {
+      DocumentAccess::Append(set, NewSample(name));
+    }
+    const auto third = std::next(set.GetElements().begin(), 2)->second;
+    set.RemoveElement(set.GetElements().back().second);
+    EXPECT_FALSE(IsSame(set.GetElement("a"), third));
+    way(set);
+    EXPECT_TRUE(IsSame(set.GetElement("a"), third));
+    EXPECT_EQ(set.AddSample(Sample("a")), "a (1)");
+    way(set);
+    EXPECT_THROW(set.GetElement("a"), Missing);
+  }
+}
+
+TEST(VexNodeTest, TheLowestFreeNumberIsFoundWhateverWentBefore) {
+  SampleSet set = SetOf({"Red", "Red", "Red", "Red"});
+  set.RenameElement("Red (2)", "Blue");
+  EXPECT_EQ(set.GetUniqueName("Red"), "Red (2)");
+  set.RemoveElement("Red (1)");
+  EXPECT_EQ(set.AddSample(Sample("Red")), "Red (1)");
+  EXPECT_EQ(set.AddSample(Sample("Red")), "Red (2)");
+  EXPECT_EQ(set.AddSample(Sample("Red")), "Red (4)");
+  set.RemoveElement("Red");
+  set.RemoveElement("Red (3)");
+  set.AddSample(Sample("Red (03)"));  // of another form
+  EXPECT_EQ(set.AddSample(Sample("Red")), "Red");
+  EXPECT_EQ(set.AddSample(Sample("Red")), "Red (3)");
+  EXPECT_EQ(set.RenameElement("Red (2)", "Red"), "Red (5)");
+  ExpectSamples(set, {"Blue", "Red (1)", "Red (2)", "Red (4)", "Red (03)", "Red", "Red (3)"});
 }
 
 TEST(VexNodeTest, AppendKeepsEqualNamesAndTheFirstIsFound) {

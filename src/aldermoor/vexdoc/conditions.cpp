@@ -27,9 +27,12 @@ ALDERMOOR_FRAME(Aldermoor::Vexdoc::Conditions::Conditions)
 
 Conditions& Conditions::operator=(const Conditions& other) try {
   if (this != &other) {
+    // All copies first, for memory may be short.
+    std::string id(other.id_);
+    std::map<std::string, std::string> attributes(other.attributes_);
     NoteChange();
-    id_ = other.id_;
-    attributes_ = other.attributes_;
+    id_.swap(id);
+    attributes_.swap(attributes);
     custom_illumination_ = other.custom_illumination_;
   }
   return *this;
@@ -55,8 +58,9 @@ const Spectrum& Conditions::GetCustomIllumination() const try {
 ALDERMOOR_FRAME(Aldermoor::Vexdoc::Conditions::GetCustomIllumination)
 
 void Conditions::SetCustomIllumination(const Spectrum& spectrum) try {
+  const SmartPointer<Spectrum> illumination(new Spectrum(spectrum));
   NoteChange();
-  custom_illumination_ = SmartPointer<Spectrum>(new Spectrum(spectrum));
+  custom_illumination_ = illumination;
 }
 ALDERMOOR_FRAME(Aldermoor::Vexdoc::Conditions::SetCustomIllumination)
 
@@ -74,8 +78,8 @@ std::string Conditions::AddAttribute(const std::string& key, const std::string& 
   if (attributes_.size() != count) {
     return "";
   }
-  std::string old = std::move(entry->second);
-  entry->second = value;
+  std::string old = value;
+  entry->second.swap(old);
   return old;
 }
 

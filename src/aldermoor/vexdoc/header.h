@@ -8,6 +8,7 @@
 
 namespace Aldermoor::Vexdoc {
 
+class AttributeGuard;
 class ElementVisitor;
 
 namespace Internals {
@@ -35,6 +36,9 @@ class DeprecatedVexHeaderInterface {
 /// Standard keys are "Name", "Description", "Creator", "Created" and "Modified"; any other key may
 /// be stored beside them and goes into the file.  "Created" and "Modified" are local time in the
 /// form "YYYY-MM-DD/hh:mm:ss", set at construction.  Texts are UTF-8.
+///
+/// An operation that fails, for want of memory for instance, leaves an element as it was, here and
+/// in the classes below.
 class ALDERMOOR_EXPORT Header : public DeprecatedVexHeaderInterface<0> {
  public:
   static constexpr const char* kNameKey = "Name";
@@ -72,6 +76,7 @@ class ALDERMOOR_EXPORT Header : public DeprecatedVexHeaderInterface<0> {
 
   /// Null for an element that came into its container by insertion, as every element does.
   virtual Header* GetParent();
+  const Header* GetParent() const { return const_cast<Header*>(this)->GetParent(); }
   virtual void SetParent(Header* parent) = 0;
   /// Calls the visitor's operation for the class of this element; children are the visitor's task.
   virtual void AcceptVisitor(ElementVisitor& visitor) = 0;
@@ -86,6 +91,7 @@ class ALDERMOOR_EXPORT Header : public DeprecatedVexHeaderInterface<0> {
   void MoveToParent(Element& element, Header* target);
 
  private:
+  friend class AttributeGuard;
   friend class Internals::DocumentAccess;
 
   Header* parent_ = nullptr;  // not owned

@@ -1,5 +1,7 @@
 #include "aldermoor/vexdoc/sample.h"
 
+#include <iterator>
+
 #include "aldermoor/utilities/exceptions/exceptions.h"
 #include "aldermoor/utilities/exceptions/frame.h"
 #include "aldermoor/vexdoc/elementvisitor.h"
@@ -53,8 +55,8 @@ SmartPointer<SampleAttribute> Sample::GetSampleAttribute(const std::string& type
         ALDERMOOR_HERE(Aldermoor::Vexdoc::Sample::GetSampleAttribute));
   }
   if (store) {
-    result->SetDerived(false);
     const_cast<Sample*>(this)->AddElement(result);  // asked for by the caller
+    result->SetDerived(false);
   }
   return result;
 }
@@ -102,14 +104,14 @@ void Sample::Remove(SampleAttributeIterator& position) try {
   if (!position.HasNext() || position.elements_ != &GetElements()) {
     return;
   }
+  auto next = std::next(position.position_);
   try {
-    position.position_ = RemoveElement(position.position_);
-    if (position.HasNext() && !position.HasMatch()) {
-      position.Move2NextMatch();
-    }
+    next = position.FindNextMatch();
   } catch (const OutOfRangeException&) {
-    // The attribute is gone, which is what was asked for.
+    // The attribute is to go all the same.
   }
+  RemoveElement(position.position_);
+  position.position_ = next;
 }
 ALDERMOOR_FRAME(Aldermoor::Vexdoc::Sample::Remove)
 

@@ -1,5 +1,8 @@
 #include "aldermoor/vexdoc/sampleattributeiterator.h"
 
+#include <algorithm>
+#include <iterator>
+
 #include "aldermoor/utilities/exceptions/frame.h"
 
 namespace Aldermoor::Vexdoc {
@@ -23,18 +26,22 @@ Utilities::Tools::SmartPointer<SampleAttribute> SampleAttributeIterator::Derefer
   return HasNext() ? position_->second : Utilities::Tools::SmartPointer<SampleAttribute>();
 }
 
-bool SampleAttributeIterator::HasMatch() const try {
-  return filter_.IsEmpty() || filter_.IsSubsetOf(*position_->second->GetConditions());
+bool SampleAttributeIterator::IsMatch(const SampleAttribute& attribute) const {
+  return filter_.IsEmpty() || filter_.IsSubsetOf(*attribute.GetConditions());
 }
+
+SampleAttributeIterator::Elements::const_iterator SampleAttributeIterator::FindNextMatch() const {
+  return std::find_if(std::next(position_), elements_->end(),
+                      [this](const auto& entry) { return IsMatch(*entry.second); });
+}
+
+bool SampleAttributeIterator::HasMatch() const try { return IsMatch(*position_->second); }
 ALDERMOOR_FRAME(Aldermoor::Vexdoc::SampleAttributeIterator::HasMatch)
 
 void SampleAttributeIterator::Move2NextMatch() try {
-  if (!HasNext()) {
-    return;
+  if (HasNext()) {
+    position_ = FindNextMatch();
   }
-  do {
-    ++position_;
-  } while (HasNext() && !HasMatch());
 }
 ALDERMOOR_FRAME(Aldermoor::Vexdoc::SampleAttributeIterator::Move2NextMatch)
 

@@ -1,6 +1,7 @@
 #include "aldermoor/vexdoc/sampleiterator.h"
 
 #include <algorithm>
+#include <iterator>
 #include <stdexcept>
 
 #include "aldermoor/utilities/exceptions/exceptions.h"
@@ -18,33 +19,21 @@ ALDERMOOR_FRAME(Aldermoor::Vexdoc::SampleIterator::SampleIterator)
 
 SampleIterator::SampleIterator(const SampleSets& sets, const Conditions& filter,
                                const std::string& type, const std::string& setName) try
-    : set_end_(sets.end()), set_(sets.begin()), type_(type), filter_(filter) {
-  Initialize(setName);
+    : sets_(&sets), is_confined_(!setName.empty()), type_(type), filter_(filter) {
+  const auto set =
+      is_confined_ ? StorageDetail::FindByName<SampleSet>(sets, setName) : sets.begin();
+  if (set != sets.end()) {
+    place_ = Front(set);
+    Search(place_);
+  }
 }
 ALDERMOOR_FRAME(Aldermoor::Vexdoc::SampleIterator::SampleIterator)
 
 SampleIterator::SampleIterator(const SampleIterator&) = default;
 SampleIterator& SampleIterator::operator=(const SampleIterator&) = default;
 
-void SampleIterator::Initialize(const std::string& setName) try {
-  if (!setName.empty()) {
-    set_ = std::find_if(set_, set_end_,
-                        [&setName](const auto& entry) { return entry.first == setName; });
-    if (set_ != set_end_) {
-      set_end_ = std::next(set_);
-    }
-  }
-  if (set_ != set_end_) {
-    position_ = set_->second->GetSamples().begin();
-  }
-  if (!HasNext() || !IsFilterMatching(*position_->second)) {
-    Move2NextMatch();
-  }
-}
-ALDERMOOR_FRAME(Aldermoor::Vexdoc::SampleIterator::Initialize)
-
 bool SampleIterator::HasNext() const {
-  return set_ != set_end_ && position_ != set_->second->GetSamples().end();
+  return place_.samples != nullptr && place_.sample != place_.samples->end();
 }
 
 bool SampleIterator::IsFilterMatching(const Sample& sample) const try {
@@ -59,43 +48,63 @@ bool SampleIterator::IsFilterMatching(const Sample& sample) const try {
 }
 ALDERMOOR_FRAME(Aldermoor::Vexdoc::SampleIterator::IsFilterMatching)
 
-void SampleIterator::Move2NextMatch() try {
-  if (HasNext()) {
-    ++position_;
-  }
-  while (set_ != set_end_) {
-    position_ = std::find_if(position_, set_->second->GetSamples().end(),
-                             [this](const auto& entry) { return IsFilterMatching(*entry.second); });
-    if (HasNext()) {
-      return;
+SampleIterator::Place SampleIterator::Front(SampleSets::const_iterator set) {
+  const ElementList<Sample>& samples = set->second->GetSamples();
+  return {&samples, samples.begin(), set};
+}
+
+SampleIterator::Place SampleIterator::FrontOfNextSet(const Place& place) const {
+  const auto set = is_confined_ ? sets_->end() : std::next(place.set);
+  return set == sets_->end() ? Place() : Front(set);
+}
+
+// Moves `place` to the first match from there on, or behind all.  A failure leaves it where the
+// search failed.
+void SampleIterator::Search(Place& place) const {
+  while (place.samples != nullptr) {
+    for (; place.sample != place.samples->end(); ++place.sample) {
+      if (IsFilterMatching(*place.sample->second)) {
+        return;
+      }
     }
-    Move2NextSampleSet();
+    place = FrontOfNextSet(place);
   }
+}
+
+void SampleIterator::Move2NextMatch() try {
+  Place place = place_;
+  if (HasNext()) {
+    ++place.sample;
+  }
+  Search(place);
+  place_ = place;
 }
 ALDERMOOR_FRAME(Aldermoor::Vexdoc::SampleIterator::Move2NextMatch)
 
-void SampleIterator::Move2NextSampleSet() {
-  do {
-    ++set_;
-    if (set_ != set_end_) {
-      position_ = set_->second->GetSamples().begin();
-    }
-  } while (set_ != set_end_ && set_->second->GetSamples().empty());
+// Goes on to the next entry of the set, whatever the filter says, or behind the last.
+void SampleIterator::StepOver() {
+  ++place_.sample;
+  if (is_confined_ && !HasNext()) {
+    place_ = Place();
+  }
 }
 
 void SampleIterator::DeprecatedDelete() try {
   if (!HasNext()) {
     return;
   }
-  try {
-    position_ = set_->second->RemoveElement(position_);
-    if (!HasNext()) {
-      ++set_;
-      Initialize("");
+  Place next = place_;
+  ++next.sample;
+  if (next.sample == next.samples->end()) {
+    next = FrontOfNextSet(next);
+    try {
+      Search(next);
+    } catch (const std::out_of_range&) {
+      // The sample is to go all the same.
     }
-  } catch (const std::out_of_range&) {
-    // The sample is gone, which is what was asked for.
   }
+  place_.set->second->RemoveElement(place_.sample);
+  place_ = next;
 }
 ALDERMOOR_FRAME(Aldermoor::Vexdoc::SampleIterator::DeprecatedDelete)
 
@@ -103,7 +112,7 @@ SmartPointer<Sample> SampleIterator::Dereference() const try {
   if (!HasNext()) {
     throw ResourceNotAvailableException("nomore samples to iterate", "");
   }
-  return position_->second;
+  return place_.sample->second;
 }
 ALDERMOOR_FRAME(Aldermoor::Vexdoc::SampleIterator::Dereference)
 

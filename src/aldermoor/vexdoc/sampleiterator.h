@@ -1,6 +1,7 @@
 #ifndef ALDERMOOR_VEXDOC_SAMPLEITERATOR_H
 #define ALDERMOOR_VEXDOC_SAMPLEITERATOR_H
 
+#include <iterator>
 #include <string>
 
 #include "aldermoor/export.h"
@@ -30,13 +31,22 @@ class SampleIteratorDeprecated {
 /// A walk over the samples of one set or of all sets of a document, in document order; with a
 /// filter, over those that hold a fitting attribute or can compute one.
 ///
+///     for (const auto& sample : document.GetFirstSample(filter, "VEXColorVector", "")) {
+///       Use(*sample);
+///     }
+///
+/// or by hand, for DeprecatedDelete and InsertSample:
+///
 ///     for (auto i = document.GetFirstSample(filter, "VEXColorVector", ""); i.HasNext(); ++i) {
 ///       Use(*i.Dereference());
 ///     }
 ///
-/// A test against the filter may compute a colour, which is not kept.
-/// Ownership: none; it is good as long as the document is, and until the sample on which it stands
-/// is removed by another way than DeprecatedDelete.
+/// A test against the filter may compute a colour, which is not kept.  A walk over one set keeps to
+/// that set, whatever comes and goes around it.
+/// Ownership: none; it is good as long as the document is, and until the sample on which it stands,
+/// or the set of that, is removed by another way than DeprecatedDelete.  Inside the loop, samples
+/// and sets may be added, inserted, renamed, exchanged and, but for those, removed; see
+/// docs/iterators.md.
 class ALDERMOOR_EXPORT SampleIterator final : public SampleIteratorDeprecated<0> {
  public:
   using SampleSets = ElementList<SampleSet>;
@@ -45,7 +55,7 @@ class ALDERMOOR_EXPORT SampleIterator final : public SampleIteratorDeprecated<0>
   SampleIterator(const SampleSets& sets, const std::string& setName);
   /// The same over the samples that can give an attribute of the kind `type` under `filter`.
   /// Throws: what Sample::GetSampleAttribute throws but ResourceNotAvailableException, here and in
-  /// the other operations that search.
+  /// the other operations that search; these then leave the walk where it was.
   SampleIterator(const SampleSets& sets, const Conditions& filter, const std::string& type,
                  const std::string& setName);
   SampleIterator(const SampleIterator& other);
@@ -63,19 +73,33 @@ class ALDERMOOR_EXPORT SampleIterator final : public SampleIteratorDeprecated<0>
   SampleIterator& operator++();
   SampleIterator operator++(int);
 
+  /// For a loop over a range.
+  SampleIterator begin() const { return *this; }
+  std::default_sentinel_t end() const { return {}; }
+  bool operator==(std::default_sentinel_t /*end*/) const { return !HasNext(); }
+  Utilities::Tools::SmartPointer<Sample> operator*() const { return Dereference(); }
+
  private:
   friend class SampleSet;
   friend class VEX;
 
-  void Initialize(const std::string& setName);
-  bool IsFilterMatching(const Sample& sample) const;
-  void Move2NextMatch();
-  void Move2NextSampleSet();
+  struct Place {
+    const ElementList<Sample>* samples = nullptr;  // of the set; null when the walk is over
+    ElementList<Sample>::const_iterator sample;
+    SampleSets::const_iterator set;
+  };
 
-  SampleSets::const_iterator set_end_;
-  SampleSets::const_iterator set_;
+  bool IsFilterMatching(const Sample& sample) const;
+  static Place Front(SampleSets::const_iterator set);
+  Place FrontOfNextSet(const Place& place) const;
+  void Search(Place& place) const;
+  void Move2NextMatch();
+  void StepOver();
+
+  const SampleSets* sets_;
+  Place place_;
+  bool is_confined_;  // to one set
   std::string type_;  // long type name
-  ElementList<Sample>::const_iterator position_;
   Conditions filter_;
 };
 

@@ -25,18 +25,17 @@ SmartPointer<Sample> SampleSet::GetSample(const std::string& name) const try {
 }
 ALDERMOOR_FRAME(Aldermoor::Vexdoc::SampleSet::GetSample)
 
-std::string SampleSet::AddSample(const Sample& sample) try { return AddElement(sample)->GetName(); }
+std::string SampleSet::AddSample(const Sample& sample) try { return AppendNamed(sample); }
 ALDERMOOR_FRAME(Aldermoor::Vexdoc::SampleSet::AddSample)
 
 std::string SampleSet::InsertSample(const Sample& sample, SampleIterator& position) try {
-  if (!position.HasNext() || position.set_->second.Get() != this) {
+  if (!position.HasNext() || position.place_.samples != &GetElements()) {
     throw VexException("SampleIterator not valid",
                        ALDERMOOR_HERE(Aldermoor::Vexdoc::SampleSet::InsertSample));
   }
-  const SmartPointer<Sample> copy(new Sample(sample));
-  InsertElement(copy, position.position_);
-  ++position.position_;
-  return copy->GetName();
+  std::string name = InsertNamed(SmartPointer<Sample>(new Sample(sample)), position.place_.sample);
+  position.StepOver();
+  return name;
 }
 ALDERMOOR_FRAME(Aldermoor::Vexdoc::SampleSet::InsertSample)
 

@@ -50,6 +50,9 @@ class ALDERMOOR_EXPORT SampleSet
 
   void SetParent(Header* parent) override;
   void AcceptVisitor(ElementVisitor& visitor) override;
+
+ private:
+  friend class VEX;  // names what it inserts
 };
 
 }  // namespace Aldermoor::Vexdoc

@@ -15,9 +15,15 @@ void Header::MoveToParent(Element& element, Header* target) {
     return;
   }
   const auto self = old_parent->GetElement(element.GetName());
-  old_parent->RemoveElement(self);
   parent_ = nullptr;  // or the insertion would move it once more
-  new_parent->AddElement(self);
+  try {
+    new_parent->AddElement(self);
+  } catch (...) {
+    parent_ = old_parent;
+    throw;
+  }
+  // Last, or an element that finds no room in its new parent would be in neither.
+  old_parent->RemoveElement(self);
   parent_ = new_parent;
 }
 

@@ -158,19 +158,19 @@ void VEX::SaveXML(File& file, bool updateCache) const try {
 }
 ALDERMOOR_FRAME(Aldermoor::Vexdoc::VEX::SaveXML)
 
-std::string VEX::AddSampleSet(const SampleSet& set) try { return AddElement(set)->GetName(); }
+std::string VEX::AddSampleSet(const SampleSet& set) try { return AppendNamed(set); }
 ALDERMOOR_FRAME(Aldermoor::Vexdoc::VEX::AddSampleSet)
 
-std::string VEX::AddSampleSet(const std::string& name) try { return AddElement(name)->GetName(); }
+std::string VEX::AddSampleSet(const std::string& name) try { return AppendNamed(SampleSet(name)); }
 ALDERMOOR_FRAME(Aldermoor::Vexdoc::VEX::AddSampleSet)
 
 std::string VEX::InsertSampleSet(const SampleSet& set, const long& position) try {
-  return InsertElement(set, position)->GetName();
+  return InsertNamed(set, position);
 }
 ALDERMOOR_FRAME(Aldermoor::Vexdoc::VEX::InsertSampleSet)
 
 std::string VEX::InsertSampleSet(const std::string& name, const long& position) try {
-  return InsertElement(name, position)->GetName();
+  return InsertNamed(SampleSet(name), position);
 }
 ALDERMOOR_FRAME(Aldermoor::Vexdoc::VEX::InsertSampleSet)
 
@@ -185,23 +185,35 @@ ALDERMOOR_FRAME(Aldermoor::Vexdoc::VEX::RemoveSampleSet)
 void VEX::RemoveAllSampleSets() try { Clear(); }
 ALDERMOOR_FRAME(Aldermoor::Vexdoc::VEX::RemoveAllSampleSets)
 
+// A set that is new comes into the document when it is filled, so that a failure leaves none.
+template <class Fill>
+std::string VEX::FillSampleSet(const std::string& setName, const Fill& fill) {
+  if (const SmartPointer<SampleSet> found = LookUp(setName)) {
+    return fill(*found);
+  }
+  const SmartPointer<SampleSet> set(new SampleSet(setName));
+  std::string name = fill(*set);
+  AppendNew(set);
+  return name;
+}
+
 std::string VEX::AddSample(const std::string& setName, const Sample& sample) try {
-  return FindElement(setName, true)->AddSample(sample);
+  return FillSampleSet(setName, [&](SampleSet& set) { return set.AddSample(sample); });
 }
 ALDERMOOR_FRAME(Aldermoor::Vexdoc::VEX::AddSample)
 
 std::string VEX::InsertSample(const std::string& setName, const Sample& sample,
                               const long& position) try {
-  return FindElement(setName, true)->InsertElement(sample, position)->GetName();
+  return FillSampleSet(setName, [&](SampleSet& set) { return set.InsertNamed(sample, position); });
 }
 ALDERMOOR_FRAME(Aldermoor::Vexdoc::VEX::InsertSample)
 
 std::string VEX::InsertSample(const Sample& sample, SampleIterator& position) try {
-  if (!position.HasNext()) {
+  if (!position.HasNext() || position.sets_ != &GetElements()) {
     throw VexException("SampleIterator not valid",
                        ALDERMOOR_HERE(Aldermoor::Vexdoc::VEX::InsertSample));
   }
-  return position.set_->second->InsertSample(sample, position);
+  return position.place_.set->second->InsertSample(sample, position);
 }
 ALDERMOOR_FRAME(Aldermoor::Vexdoc::VEX::InsertSample)
 
@@ -238,7 +250,8 @@ void VEX::SwapSample(const std::string& setName, const std::string& first,
 }
 ALDERMOOR_FRAME(Aldermoor::Vexdoc::VEX::SwapSample)
 
-std::string VEX::GetUniqueSampleName(const std::string& setName, const std::string& name) try {
+std::string VEX::GetUniqueSampleName(const std::string& setName, const std::string& name) const
+    try {
   try {
     return FindElement(setName)->GetUniqueName(name);
   } catch (const ResourceNotAvailableException&) {

@@ -72,6 +72,7 @@ class ALDERMOOR_EXPORT VEX
 
   /// The forms that add or insert keep a copy and return its name, which is another one if the
   /// name was taken.  Indices count from 0 to the number of children.
+  /// Throws: OutOfRangeException for another index, and nothing is changed.
   std::string AddSampleSet(const SampleSet& set);
   std::string AddSampleSet(const std::string& name);
   std::string InsertSampleSet(const SampleSet& set, const long& position);
@@ -80,13 +81,14 @@ class ALDERMOOR_EXPORT VEX
   void RemoveSampleSet(const std::string& name);
   void RemoveAllSampleSets();
   const ElementList<SampleSet>& GetSampleSets() const { return GetElements(); }
-  unsigned long GetSampleSetCount() { return Size(); }
+  unsigned long GetSampleSetCount() const { return Size(); }
 
-  /// A set of that name is made if there is none.
+  /// A set of that name is made if there is none, unless the sample cannot be added.
   std::string AddSample(const std::string& setName, const Sample& sample);
   std::string InsertSample(const std::string& setName, const Sample& sample, const long& position);
   /// Inserts a copy in front of the sample on which `position` stands, and moves `position` to the
-  /// entry behind that one.  Throws: VexException if `position` stands on none.
+  /// entry behind that one.
+  /// Throws: VexException if `position` stands on no sample of this document.
   std::string InsertSample(const Sample& sample, SampleIterator& position);
   /// Throws: OutOfRangeException if there is no such set or no such sample in it.
   Utilities::Tools::SmartPointer<Sample> FindSample(const std::string& setName,
@@ -103,11 +105,15 @@ class ALDERMOOR_EXPORT VEX
   /// Throws: ResourceNotAvailableException for the set, VexException for a missing sample.
   void SwapSample(const std::string& setName, const std::string& first, const std::string& second);
   /// "Unknown" if there is no such set.
-  std::string GetUniqueSampleName(const std::string& setName, const std::string& name);
+  std::string GetUniqueSampleName(const std::string& setName, const std::string& name) const;
 
   /// Throws: std::logic_error, always: a document is the root.
   void SetParent(Header* parent) override;
   void AcceptVisitor(ElementVisitor& visitor) override;
+
+ private:
+  template <class Fill>
+  std::string FillSampleSet(const std::string& setName, const Fill& fill);
 };
 
 }  // namespace Aldermoor::Vexdoc

@@ -20,7 +20,10 @@ class DocumentAccess;
 ///
 /// Ownership: children are shared with whoever holds a SmartPointer to them; a removed child lives
 /// on as long as somebody does.  Copies are deep.  The key of a child is fixed at insertion;
-/// rename children through RenameElement.
+/// rename children through RenameElement.  docs/iterators.md tells which positions, references and
+/// pointers outlive which operation.
+/// Throws: NullPointerException for an empty pointer to an element.  Whatever fails leaves the
+/// container as it was, and its "Modified" too.
 template <class T, class StoragePolicy>
 class VexNode : public Header {
  public:
@@ -44,6 +47,7 @@ class VexNode : public Header {
   typename Elements::const_iterator InsertElement(
       const Pointer& element, const typename Elements::const_iterator& position);
   /// Inserts a deep copy at the index `position`, 0..Size(), and returns it.
+  /// Throws: OutOfRangeException for another index, here and in the form below.
   Pointer InsertElement(const T& element, long position);
   /// Inserts a new empty element of that name and returns it.
   template <class Element = T>
@@ -57,15 +61,17 @@ class VexNode : public Header {
   /// Returns the entry behind the removed one.
   typename Elements::const_iterator RemoveElement(
       const typename Elements::const_iterator& position);
-  /// The two forms do nothing if there is no such element.
+  /// The two forms do nothing if there is no such element; of equal names the first goes.
   void RemoveElement(const Pointer& element);
   void RemoveElement(const std::string& name);
 
-  /// Gives the element another name, made unique where names are; its place stays.  Returns the
-  /// name that was free before the old one was given up.
+  /// Gives the element another name, made unique where names are; it stays where it is, and so do
+  /// all positions that stand on it.  Returns the name
+  /// that was free before the old one was given up.
   /// Throws: ResourceNotAvailableException if there is no element `oldName`.
   std::string RenameElement(const std::string& oldName, const std::string& newName);
-  /// Exchanges the places of two elements.  Throws: VexException if one of them is missing.
+  /// Exchanges the places of two elements; positions go with the elements on which they stand.
+  /// Throws: VexException if one of them is missing.
   void SwapElements(const std::string& first, const std::string& second);
 
   /// Throws: ResourceNotAvailableException if there is no such element.
@@ -78,6 +84,7 @@ class VexNode : public Header {
 
   const Elements& GetElements() const { return policy_.GetElements(); }
   std::string GetUniqueName(const std::string& name) const;
+  /// Neither tells the children nor changes "Modified".
   void Clear();
   unsigned int Size() const { return static_cast<unsigned int>(GetElements().size()); }
 
@@ -89,8 +96,24 @@ class VexNode : public Header {
   VexNode& operator=(const VexNode& other);
   ~VexNode() override;
 
+  /// As InsertElement, but they return the name of what was inserted.
+  std::string InsertNamed(const T& element, long position);
+  std::string InsertNamed(const Pointer& element,
+                          const typename Elements::const_iterator& position);
+  std::string AppendNamed(const T& element);
+  /// Empty if there is no such element.
+  Pointer LookUp(const std::string& name) const;
+  /// Puts a new element at the end, which does not count as a modification.
+  void AppendNew(const Pointer& element);
+
  private:
   friend class Internals::DocumentAccess;
+
+  // `name` becomes that under which `element` is stored then.
+  typename Elements::const_iterator Insert(const Pointer& element,
+                                           const typename Elements::const_iterator& position,
+                                           std::string& name);
+  typename Elements::const_iterator PositionOf(long index) const;
 
   // Where the frame of a member says it is.
   static std::string Here(const char* member);
@@ -103,15 +126,14 @@ template <class Element>
 requires std::constructible_from<Element, const std::string&> Utilities::Tools::SmartPointer<T>
 VexNode<T, StoragePolicy>::FindElement(const std::string& name, bool create)
 try {
-  try {
+  if (!create) {
     return FindElement(name);
-  } catch (const Utilities::Exceptions::ResourceNotAvailableException&) {
-    if (!create) {
-      throw;
-    }
+  }
+  if (const Pointer found = LookUp(name)) {
+    return found;
   }
   const Pointer element(new Element(name));
-  policy_.Insert(element, GetElements().end());
+  AppendNew(element);
   return element;
 }
 ALDERMOOR_TEMPLATE_FRAME(Here("FindElement"))

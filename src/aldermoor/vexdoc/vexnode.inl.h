@@ -5,7 +5,9 @@
 
 #include <iterator>
 
+#include "aldermoor/utilities/exceptions/exceptions.h"
 #include "aldermoor/utilities/exceptions/frame.h"
+#include "aldermoor/vexdoc/attributeguard.h"
 #include "aldermoor/vexdoc/elementcloner.h"
 #include "aldermoor/vexdoc/vexexception.h"
 #include "aldermoor/vexdoc/vexnode.h"
@@ -50,8 +52,7 @@ VexNode<T, P>::~VexNode() = default;
 template <class T, class P>
 bool VexNode<T, P>::AddElement(const Pointer& element) try {
   const std::string name = element->GetName();
-  InsertElement(element, GetElements().end());
-  return element->GetName() == name;
+  return InsertElement(element, GetElements().end())->first == name;
 }
 ALDERMOOR_TEMPLATE_FRAME(Here("AddElement"))
 
@@ -64,22 +65,74 @@ Utilities::Tools::SmartPointer<T> VexNode<T, P>::AddElement(const T& element) tr
 ALDERMOOR_TEMPLATE_FRAME(Here("AddElement"))
 
 template <class T, class P>
-typename ElementList<T>::const_iterator VexNode<T, P>::InsertElement(
-    const Pointer& element, const typename Elements::const_iterator& position) try {
+typename ElementList<T>::const_iterator VexNode<T, P>::Insert(
+    const Pointer& element, const typename Elements::const_iterator& position, std::string& name) {
+  AttributeGuard modified(*this, Header::kModifiedKey);
   SetModified();
   element->SetParent(this);
-  return policy_.Insert(element, position);
+  const auto entry = policy_.Insert(element, position, name);
+  modified.Keep();
+  return entry;
+}
+
+template <class T, class P>
+typename ElementList<T>::const_iterator VexNode<T, P>::PositionOf(long index) const {
+  const long count = static_cast<long>(GetElements().size());
+  if (index < 0 || index > count) {
+    throw Utilities::Exceptions::OutOfRangeException(
+        "position " + std::to_string(index) + " is outside 0.." + std::to_string(count),
+        Utilities::Exceptions::MakeLocation("", Here("PositionOf").c_str(), __FILE__, __LINE__));
+  }
+  return index <= count / 2 ? std::next(GetElements().begin(), index)
+                            : std::prev(GetElements().end(), count - index);
+}
+
+template <class T, class P>
+typename ElementList<T>::const_iterator VexNode<T, P>::InsertElement(
+    const Pointer& element, const typename Elements::const_iterator& position) try {
+  std::string name;
+  return Insert(element, position, name);
 }
 ALDERMOOR_TEMPLATE_FRAME(Here("InsertElement"))
 
 template <class T, class P>
 Utilities::Tools::SmartPointer<T> VexNode<T, P>::InsertElement(const T& element,
                                                                long position) try {
+  const auto place = PositionOf(position);
   const Pointer clone = CloneElement(element);
-  InsertElement(clone, std::next(GetElements().begin(), position));
+  InsertElement(clone, place);
   return clone;
 }
 ALDERMOOR_TEMPLATE_FRAME(Here("InsertElement"))
+
+template <class T, class P>
+std::string VexNode<T, P>::InsertNamed(const Pointer& element,
+                                       const typename Elements::const_iterator& position) try {
+  std::string name;
+  Insert(element, position, name);
+  return name;
+}
+ALDERMOOR_TEMPLATE_FRAME(Here("InsertNamed"))
+
+template <class T, class P>
+std::string VexNode<T, P>::InsertNamed(const T& element, long position) try {
+  const auto place = PositionOf(position);
+  return InsertNamed(CloneElement(element), place);
+}
+ALDERMOOR_TEMPLATE_FRAME(Here("InsertNamed"))
+
+template <class T, class P>
+std::string VexNode<T, P>::AppendNamed(const T& element) try {
+  return InsertNamed(CloneElement(element), GetElements().end());
+}
+ALDERMOOR_TEMPLATE_FRAME(Here("AppendNamed"))
+
+template <class T, class P>
+void VexNode<T, P>::AppendNew(const Pointer& element) try {
+  std::string name;
+  policy_.Insert(element, GetElements().end(), name);
+}
+ALDERMOOR_TEMPLATE_FRAME(Here("AppendNew"))
 
 template <class T, class P>
 typename ElementList<T>::const_iterator VexNode<T, P>::RemoveElement(
@@ -121,10 +174,11 @@ std::string VexNode<T, P>::RenameElement(const std::string& oldName,
   if (oldName == newName) {
     return oldName;
   }
-  const Pointer element = position->second;
   std::string result = policy_.GetUniqueName(newName);
-  element->SetName(newName);
-  policy_.Insert(element, policy_.Erase(position));
+  AttributeGuard name(*position->second, Header::kNameKey);
+  position->second->SetName(newName);
+  policy_.Rename(position);
+  name.Keep();
   return result;
 }
 ALDERMOOR_TEMPLATE_FRAME(Here("RenameElement"))
@@ -151,9 +205,19 @@ ALDERMOOR_TEMPLATE_FRAME(Here("GetElement"))
 
 template <class T, class P>
 Utilities::Tools::SmartPointer<T> VexNode<T, P>::FindElement(const std::string& name) const try {
-  return policy_.Find(name);
+  Pointer found = policy_.Find(name);
+  if (!found) {
+    StorageDetail::FailNotFound<T>(name);
+  }
+  return found;
 }
 ALDERMOOR_TEMPLATE_FRAME(Here("FindElement"))
+
+template <class T, class P>
+Utilities::Tools::SmartPointer<T> VexNode<T, P>::LookUp(const std::string& name) const try {
+  return policy_.Find(name);
+}
+ALDERMOOR_TEMPLATE_FRAME(Here("LookUp"))
 
 template <class T, class P>
 std::string VexNode<T, P>::GetUniqueName(const std::string& name) const try {

@@ -101,10 +101,9 @@ void Initialisator::AddType(std::string_view key, std::span<const std::string_vi
 }
 ALDERMOOR_FRAME(Aldermoor::Tristim::Internals::Initialisator::AddType)
 
-const std::vector<std::string>& Initialisator::GetSupportedValues(std::string_view key) try {
+const std::vector<std::string>& Initialisator::GetSupportedValues(std::string_view key) const {
   const auto found = supported_values_.find(key);
-  return found != supported_values_.end() ? found->second : supported_values_[std::string(key)];
+  return found != supported_values_.end() ? found->second : none_;
 }
-ALDERMOOR_FRAME(Aldermoor::Tristim::Internals::Initialisator::GetSupportedValues)
 
 }  // namespace Aldermoor::Tristim::Internals

@@ -1,6 +1,7 @@
 #ifndef ALDERMOOR_TRISTIM_INTERNALS_INITIALISATOR_H
 #define ALDERMOOR_TRISTIM_INTERNALS_INITIALISATOR_H
 
+#include <atomic>
 #include <functional>
 #include <map>
 #include <span>
@@ -16,13 +17,13 @@ namespace Aldermoor::Tristim::Internals {
 /// space under "ColorSpaceDescription." and its word: the absolute ones first, then the delta ones.
 ///
 /// Shared state: one object for the process, built by the first HXMeasureConditions or the first
-/// look-up, whichever comes first, and never destroyed.
+/// look-up, whichever comes first, in whichever thread; constant from then on and never destroyed.
 class Initialisator {
  public:
   static Initialisator& Get();
 
-  /// The list of `key`.  An unknown key gets an empty list, which then stays.
-  const std::vector<std::string>& GetSupportedValues(std::string_view key);
+  /// The list of `key`; an empty one for an unknown key.  It stays as long as the process.
+  const std::vector<std::string>& GetSupportedValues(std::string_view key) const;
 
  private:
   friend class NeverDestroyed<Initialisator>;
@@ -32,17 +33,19 @@ class Initialisator {
   void AddType(std::string_view key, std::span<const std::string_view> words);
 
   std::map<std::string, std::vector<std::string>, std::less<>> supported_values_;
+  std::vector<std::string> none_;
 };
 
 /// Base of HXMeasureConditions: its constructor makes the tables if nobody has yet, so that they
 /// are there for static objects too.
 ///
-/// Shared state: whether the tables are built.
+/// Shared state: whether the tables are built, which several threads may ask at a time.
 class GlobalStringInitialisator {
  public:
   GlobalStringInitialisator() {
-    if (initialisator_ == nullptr) [[unlikely]] {
-      initialisator_ = &Initialisator::Get();
+    if (!is_built_.load(std::memory_order_acquire)) [[unlikely]] {
+      Initialisator::Get();
+      is_built_.store(true, std::memory_order_release);
     }
   }
   GlobalStringInitialisator(const GlobalStringInitialisator&) = default;
@@ -52,7 +55,7 @@ class GlobalStringInitialisator {
   ~GlobalStringInitialisator() = default;
 
  private:
-  static inline constinit Initialisator* initialisator_ = nullptr;
+  static inline constinit std::atomic<bool> is_built_ = false;
 };
 
 }  // namespace Aldermoor::Tristim::Internals

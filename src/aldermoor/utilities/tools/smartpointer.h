@@ -1,12 +1,15 @@
 #ifndef ALDERMOOR_UTILITIES_TOOLS_SMARTPOINTER_H
 #define ALDERMOOR_UTILITIES_TOOLS_SMARTPOINTER_H
 
+#include <concepts>
+#include <cstddef>
 #include <cstdint>
 #include <limits>
 #include <memory>
 #include <stdexcept>
 #include <string>
 #include <type_traits>
+#include <utility>
 
 #include "aldermoor/export.h"
 #include "aldermoor/utilities/exceptions/exceptions.h"
@@ -43,12 +46,18 @@ class ReferenceCount {
 /// Shared owner of a heap object; the object itself needs no counter.
 ///
 /// Ownership: the last SmartPointer deletes the object as a `T`, so bases need virtual destructors.
+/// An assignment takes the new object over before it gives up the old one, so that the source may
+/// live in the old one: `node = node->next`.
 /// The count has no lock: all pointers to one object stay in one thread.  Throws:
 /// NullPointerException from operator-> and operator* when empty.
 template <class T>
 class SmartPointer {
  public:
   SmartPointer() = default;
+
+  /// Empty; from the word `nullptr` alone, so that 0 goes on to the forms below.
+  template <std::same_as<std::nullptr_t> Null>
+  SmartPointer(Null /*null*/) {}  // NOLINT(google-explicit-constructor)
 
   /// Takes ownership; null gives an empty pointer.
   explicit SmartPointer(T* pointee) {
@@ -87,19 +96,14 @@ class SmartPointer {
 
   SmartPointer& operator=(const SmartPointer& other) {
     if (this != &other) {
-      Release();
-      Share(other.pointee_, other.count_);
+      SmartPointer(other).Swap(*this);
     }
     return *this;
   }
 
   SmartPointer& operator=(SmartPointer&& other) noexcept {
     if (this != &other) {
-      Release();
-      count_ = other.count_;
-      pointee_ = other.pointee_;
-      other.count_ = nullptr;
-      other.pointee_ = nullptr;
+      SmartPointer(std::move(other)).Swap(*this);
     }
     return *this;
   }
@@ -147,6 +151,11 @@ class SmartPointer {
     }
   }
 
+  void Swap(SmartPointer& other) noexcept {
+    std::swap(count_, other.count_);
+    std::swap(pointee_, other.pointee_);
+  }
+
   void Release() {
     ReferenceCount* const count = count_;
     T* const pointee = pointee_;
@@ -181,6 +190,18 @@ void SmartPointer<T>::FailNull(const char* operation) {
 template <class T, class U>
 bool IsSame(const SmartPointer<T>& first, const SmartPointer<U>& second) {
   return first.Get() == second.Get();
+}
+
+/// The same for pointers to a class and to one derived from it.
+template <class T, class U>
+requires(std::is_convertible_v<T*, U*> || std::is_convertible_v<U*, T*>) bool operator==(
+    const SmartPointer<T>& first, const SmartPointer<U>& second) {
+  return IsSame(first, second);
+}
+
+template <class T>
+bool operator==(const SmartPointer<T>& pointer, std::nullptr_t) {
+  return pointer.IsNull();
 }
 
 /// `other` as a pointer to the derived class `To`; empty if the object is none.

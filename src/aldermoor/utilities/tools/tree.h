@@ -2,6 +2,7 @@
 #define ALDERMOOR_UTILITIES_TOOLS_TREE_H
 
 #include <list>
+#include <utility>
 
 #include "aldermoor/utilities/exceptions/frame.h"
 #include "aldermoor/utilities/tools/smartpointer.h"
@@ -26,8 +27,11 @@ class Tree : public T {
 
   Tree& operator=(const Tree& other) try {
     if (this != &other) {
-      T::operator=(other);
-      children_ = other.children_;
+      // All copies first, for memory may be short; and `other` may be one of the children.
+      T payload(other);
+      Children children(other.children_);
+      T::operator=(std::move(payload));
+      children_.swap(children);
       AdoptChildren();
     }
     return *this;
@@ -42,8 +46,9 @@ class Tree : public T {
 
   /// Appends `child` itself.
   void AdoptChild(const SmartPointer<Tree>& child) {
-    child->parent_ = this;
+    Tree& added = *child;
     children_.push_back(child);
+    added.parent_ = this;
   }
 
   const Children& GetChildren() const { return children_; }
