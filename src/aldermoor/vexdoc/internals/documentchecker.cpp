@@ -169,7 +169,7 @@ void DocumentChecker::VisitSpectrum(Spectrum& spectrum) try {
   }
   if (!data.empty()) {
     CheckRange(*conditions);
-    CheckSteps("value", *conditions, data.size());
+    CheckSteps("", *conditions, data.size());
   }
 }
 ALDERMOOR_FRAME(Aldermoor::Vexdoc::Internals::DocumentChecker::VisitSpectrum)
@@ -283,7 +283,7 @@ void DocumentChecker::CheckIllumination(const Conditions& block) {
   }
   CheckNumbers("value of the illumination", curve);
   if (!curve.empty()) {
-    CheckSteps("value of the illumination", block, curve.size());
+    CheckSteps(" of the illumination", block, curve.size());
   }
   if (block.RefersToCustomIllumination()) {
     return;
@@ -308,23 +308,22 @@ void DocumentChecker::CheckRange(const Conditions& conditions) {
   }
 }
 
-void DocumentChecker::CheckSteps(const std::string& what, const Conditions& conditions,
+void DocumentChecker::CheckSteps(const std::string& whose, const Conditions& conditions,
                                  std::size_t points) {
-  const std::string range =
-      "from " + Quoted(conditions.GetAttribute(ConditionKeys::kWavelengthMin, "380")) + " to " +
+  const std::string values =
+      Counted(points, "value") + whose + " from " +
+      Quoted(conditions.GetAttribute(ConditionKeys::kWavelengthMin, "380")) + " to " +
       Quoted(conditions.GetAttribute(ConditionKeys::kWavelengthMax, "730"));
   try {
     const WavelengthSteps steps(conditions, points);
     const std::int64_t last = steps.first + steps.step * (static_cast<std::int64_t>(points) - 1);
     if (points > 1 && steps.step <= 0) {
-      Add(Counted(points, what.c_str()) + " " + range +
-          " would get equal or falling wavelengths: the step is in whole nm");
+      Add(values + " would get equal or falling wavelengths: the step is in whole nm");
     } else if (steps.first < 0 && last >= 0) {
-      Add(Counted(points, what.c_str()) + " " + range +
-          " would come back in another order: wavelengths are written without a sign");
+      Add(values + " would come back in another order: wavelengths are written without a sign");
     }
   } catch (const std::invalid_argument&) {
-    Add(Counted(points, what.c_str()) + " " + range + ", which are no whole wavelengths");
+    Add(values + ", which are no whole wavelengths");
   }
 }
 

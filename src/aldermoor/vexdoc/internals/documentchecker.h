@@ -42,7 +42,7 @@ class DocumentChecker : public ElementVisitor {
   void CheckBlock(const Conditions& block);
   void CheckIllumination(const Conditions& block);
   void CheckRange(const Conditions& conditions);
-  void CheckSteps(const std::string& what, const Conditions& conditions, std::size_t points);
+  void CheckSteps(const std::string& whose, const Conditions& conditions, std::size_t points);
   void CheckTree(const DataTree& tree, unsigned int depth);
   void CheckTreeName(const std::string& what, const std::string& name);
   void CheckTreeAttributes(const DataTree& tree, unsigned int depth);
