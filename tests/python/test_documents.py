@@ -87,11 +87,12 @@ def test_what_is_built_comes_back_from_a_file(tmp_path: Path) -> None:
 def test_what_a_file_would_not_bring_back_is_not_saved(tmp_path: Path) -> None:
     document = aldermoor.Document()
     sample = document.add_set("s").add_sample("t")
-    sample.add_spectrum(numpy.ones(31))
+    span = {"Physical.WavelengthSpectrumMin": "400nm", "Physical.WavelengthSpectrumMax": "700nm"}
+    sample.add_spectrum(numpy.ones(31), span)
     assert document.faults() == []
     document.save(tmp_path / "a.xml")
     good = (tmp_path / "a.xml").read_bytes()
-    sample.add_spectrum(numpy.ones(31), {"Physical.NumberOfDataPointsSpectrum": "36"})
+    sample.add_spectrum(numpy.ones(31), span | {"Physical.NumberOfDataPointsSpectrum": "36"})
     sample.add_spectrum(numpy.ones(36), {"Physical.WavelengthSpectrumMax": "400nm"})
     sample.set_header("Note", "\x01")
     with pytest.raises(aldermoor.SaveError, match="set 's', sample 't', Spectrum 2: ") as caught:
