@@ -113,8 +113,8 @@ py::list ToFaults(const std::vector<Vexdoc::DocumentFault>& faults) {
   const py::object type = py::module_::import("aldermoor._results").attr("Fault");
   py::list list;
   for (const Vexdoc::DocumentFault& fault : faults) {
-    list.append(type(TextOf(fault.set), TextOf(fault.sample),
-                     TextOf(fault.attribute), TextOf(fault.reason)));
+    list.append(type(TextOf(fault.set), TextOf(fault.sample), TextOf(fault.attribute),
+                     TextOf(fault.reason)));
   }
   return list;
 }

@@ -114,8 +114,8 @@ SmartPointer<Conditions> Around(const SmartPointer<Conditions>& inner, float val
 }
 
 TEST(ConditionsTest, ABlockCanTakeOverTheConditionsOfItsOwnCurve) {
-  const SmartPointer<Conditions> block = Around(
-      SmartPointer<Conditions>(new Conditions("7", With({{"a", "of the curve, and long enough"}}))));
+  const SmartPointer<Conditions> block = Around(SmartPointer<Conditions>(
+      new Conditions("7", With({{"a", "of the curve, and long enough"}}))));
   *block = *block->GetCustomIllumination().GetConditions();  // which goes with the curve
   EXPECT_EQ(block->GetID(), "7");
   EXPECT_EQ(block->GetAttribute("a"), "of the curve, and long enough");

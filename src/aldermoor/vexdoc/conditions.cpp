@@ -16,6 +16,15 @@ using Utilities::Exceptions::Filled;
 using Utilities::Exceptions::ResourceNotAvailableException;
 using Utilities::Tools::SmartPointer;
 
+namespace {
+
+bool HaveEqualAttributes(const Conditions& first, const Conditions& second) {
+  return first.HasCustomIllumination() == second.HasCustomIllumination() &&
+         first.GetAttributes() == second.GetAttributes();
+}
+
+}  // namespace
+
 unsigned long Conditions::changes_of_shared_ = 0;
 
 Conditions::Conditions() : Conditions("0") {}
@@ -50,8 +59,8 @@ Conditions::~Conditions() {
   while (curve.UseCount() == 1) {
     const SmartPointer<Conditions> block = curve->GetConditions();
     curve->SetConditions(SmartPointer<Conditions>());
-    curve = block.UseCount() == 1 ? std::move(block->custom_illumination_)
-                                  : SmartPointer<Spectrum>();
+    curve =
+        block.UseCount() == 1 ? std::move(block->custom_illumination_) : SmartPointer<Spectrum>();
   }
 }
 
@@ -122,11 +131,6 @@ void Conditions::RemoveAllAttributes() {
   attributes_.clear();
 }
 
-bool Conditions::HasEqualAttributes(const Conditions& other) const {
-  return HasCustomIllumination() == other.HasCustomIllumination() &&
-         attributes_ == other.attributes_;
-}
-
 // A custom illumination that the attributes do not refer to is not compared.
 bool Conditions::RefersToCustomIllumination() const {
   if (!HasCustomIllumination()) {
@@ -145,7 +149,7 @@ bool Conditions::Equals(const Conditions& other) const {
   // A walk that comes back to a pair goes round for ever and finds nothing new.  The mark moves on
   // after 1, 2, 4 ... steps, so that it gets onto every ring.
   std::pair<const Conditions*, const Conditions*> mark;
-  for (std::size_t step = 1, next_mark = 1; first->HasEqualAttributes(*second); ++step) {
+  for (std::size_t step = 1, next_mark = 1; HaveEqualAttributes(*first, *second); ++step) {
     if (!first->RefersToCustomIllumination() || mark == std::pair(first, second)) {
       return have_equal_values;
     }

@@ -57,8 +57,8 @@ class ALDERMOOR_EXPORT Conditions final : public DeprecatedConditionsInterface<0
   const Spectrum& GetCustomIllumination() const override;
   /// Keeps a copy of `spectrum`; the attributes stay as they are.
   ///
-  /// A block whose curve, directly or over others, has the block itself as its conditions works, but
-  /// is never freed: the two hold each other.
+  /// A block whose curve, directly or over others, has the block itself as its conditions works,
+  /// but is never freed: the two hold each other.
   void SetCustomIllumination(const Spectrum& spectrum) override;
 
   /// Stores the value and returns the one it replaces, or the empty string.  An empty key is
@@ -88,8 +88,6 @@ class ALDERMOOR_EXPORT Conditions final : public DeprecatedConditionsInterface<0
  private:
   friend class Internals::ConditionManager;
 
-  bool HasEqualAttributes(const Conditions& other) const;
-
   /// Writes nothing for conditions of one's own, which other threads may build at the same time.
   void NoteChange() {
     if (is_shared_) {
@@ -109,9 +107,8 @@ class ALDERMOOR_EXPORT Conditions final : public DeprecatedConditionsInterface<0
 /// The block of this content that all attributes of the process share, made if there is none; what
 /// SampleAttribute::SetConditions takes.
 ///
-/// It is the block that an attribute built from `conditions` gets.  Whoever changes it changes it for
-/// everybody.  Its ID is given by the process.
-/// Shared state: the blocks of the process.
+/// It is the block that an attribute built from `conditions` gets.  Whoever changes it changes it
+/// for everybody.  Its ID is given by the process. Shared state: the blocks of the process.
 ALDERMOOR_EXPORT Utilities::Tools::SmartPointer<Conditions> SharedConditions(
     const Conditions& conditions);
 

@@ -9,8 +9,8 @@
 #include "aldermoor/utilities/filesystem/file.h"
 #include "aldermoor/vexdoc/vexexception.h"
 
-/// Checks of files, for people who want to know everything that is wrong with one where a load tells
-/// the first fault only, and of documents before they become files.
+/// Checks of files, for people who want to know everything that is wrong with one where a load
+/// tells the first fault only, and of documents before they become files.
 namespace Aldermoor::Vexdoc {
 
 class VEX;
@@ -75,8 +75,8 @@ struct DocumentFault {
   ALDERMOOR_EXPORT std::string GetText() const;
 };
 
-/// The faults of a document in the order of its elements: whatever VEX::SaveXML would refuse, a load
-/// of the file would refuse, or would come back as something else.
+/// The faults of a document in the order of its elements: whatever VEX::SaveXML would refuse, a
+/// load of the file would refuse, or would come back as something else.
 ///
 /// A document without faults is read again with the same content, but for what docs/xmlformat.md
 /// names: digits beyond the sixth, derived attributes, dates that were not there.  What is wrong

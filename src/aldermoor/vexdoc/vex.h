@@ -48,8 +48,8 @@ class ALDERMOOR_EXPORT VEX
   /// their conditions, and colours of a legacy document without observer (docs/xmlformat.md).
   /// SaveCheckedXML of inspection.h refuses it.
   /// Throws: VexException if the document holds text that XML cannot carry;
-  /// InvalidArgumentException for a range of wavelengths that is no number; NullPointerException for
-  /// an attribute without conditions.  The message names the set and the sample.
+  /// InvalidArgumentException for a range of wavelengths that is no number; NullPointerException
+  /// for an attribute without conditions.  The message names the set and the sample.
   void Store(std::ostream& out) const override;
   /// Replaces the content of this document by the XML read from `in`.  Its sets are removed first,
   /// and stay so if the text cannot be read.

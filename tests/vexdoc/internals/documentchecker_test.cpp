@@ -105,18 +105,20 @@ class Generator {
   }
 
   std::string Text() {
-    static const std::string good[] = {"",    "plain", "a b",  "  ",      "\xC3\xA9", "\r\n",
-                                       "]]>", "<&>'",  "\x7F", "\xC2\x85", "\xE2\x80\xA8",
-                                       "\xF0\x9F\x98\x80", "x\n y", "0", "\t\"", "\xEF\xBB\xBF"};
-    static const std::string bad[] = {"a\x01", "\xFF", std::string("a\0b", 3), "\xEF\xBF\xBF",
-                                      "\x1F", "\xED\xA0\x80"};
+    static const std::string good[] = {"",         "plain",    "a b",          "  ",
+                                       "\xC3\xA9", "\r\n",     "]]>",          "<&>'",
+                                       "\x7F",     "\xC2\x85", "\xE2\x80\xA8", "\xF0\x9F\x98\x80",
+                                       "x\n y",    "0",        "\t\"",         "\xEF\xBB\xBF"};
+    static const std::string bad[] = {"a\x01",        "\xFF", std::string("a\0b", 3),
+                                      "\xEF\xBF\xBF", "\x1F", "\xED\xA0\x80"};
     return Seldom() ? OneOf(bad) : OneOf(good);
   }
 
   float Number() {
     using Limits = std::numeric_limits<float>;
-    static const float good[] = {0.0F,          -0.0F,         0.5F,          0.12345678F, 1e30F,
-                                 Limits::max(), Limits::min(), Limits::denorm_min(), -273.15F};
+    static const float good[] = {0.0F,    -0.0F,         0.5F,          0.12345678F,
+                                 1e30F,   Limits::max(), Limits::min(), Limits::denorm_min(),
+                                 -273.15F};
     static const float bad[] = {Limits::quiet_NaN(), Limits::infinity(), -Limits::infinity()};
     return Below(2000) == 0 ? OneOf(bad) : OneOf(good);
   }
@@ -242,7 +244,7 @@ class Generator {
 
   SmartPointer<DataTree> MakeTree(int depth) {
     static const char* const names[] = {"X", "a:b", "Note", "\xC3\xA9", "_", "xmlns", "Value"};
-    static const char* const odd[] = {"",   "1x",      "a b",    "Spectrum", "VEXRecipe",
+    static const char* const odd[] = {"",  "1x",   "a b",    "Spectrum", "VEXRecipe",
                                       "<", "\x01", "Sample", "\xFF"};
     const SmartPointer<DataTree> tree = Tree(Seldom() ? OneOf(odd) : OneOf(names), Text());
     if (Seldom()) {
@@ -433,7 +435,8 @@ TEST(DocumentCheckerTest, EveryFaultIsToldWithItsPlaceAndKeepsTheFileAsItIs) {
 TEST(DocumentCheckerTest, TheLimitsThemselvesAreNoFault) {
   for (const auto& attribute :
        {Unknown(Nested(252)), Unknown(ManyNames(32758)), SpectrumUnder({{kMaxKey, "415"}}),
-        SpectrumUnder({{kMinKey, "-32768"}, {kMaxKey, "-1"}}), UnderCurve({{kIlluminationKey, "Userdefined"}}, 36)}) {
+        SpectrumUnder({{kMinKey, "-32768"}, {kMaxKey, "-1"}}),
+        UnderCurve({{kIlluminationKey, "Userdefined"}}, 36)}) {
     const VEX document = DocumentOf({attribute});
     EXPECT_EQ(LossOf(document), "");
     EXPECT_EQ(FaultsOf(document), "");

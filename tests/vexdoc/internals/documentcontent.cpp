@@ -33,7 +33,8 @@ class Content {
   void Add(const Header& header) {
     for (const auto& [key, value] : header.GetAttributes()) {
       const bool is_name = key == "Name" || key == "Description" || key == "Creator";
-      if (key != Header::kCreatedKey && key != Header::kModifiedKey && !(is_name && value.empty())) {
+      if (key != Header::kCreatedKey && key != Header::kModifiedKey &&
+          !(is_name && value.empty())) {
         Add(key);
         Add(value);
       }

@@ -157,15 +157,15 @@ TEST_F(SavedConditionsTest, FailuresOfASaveNameTheSetAndTheSample) {
               }).starts_with(place + "lexical_cast(): fail to convert 'x'"));
   EXPECT_EQ(MessageOf<NullPointerException>([&] { XmlOf(failing(Shared(Recipe()))); }),
             place + "accessed null pointer (class Aldermoor::Vexdoc::Conditions)");
-  EXPECT_EQ(MessageOf<VexException>([&] {
-              XmlOf(failing(Shared(Recipe({}, "a\xFF", 0, "", {}))));
-            }),
-            "An error occurred during composing a VEXStream:\n" + place +
-                "XML cannot carry the text 'a\xFF'");
+  EXPECT_EQ(
+      MessageOf<VexException>([&] { XmlOf(failing(Shared(Recipe({}, "a\xFF", 0, "", {})))); }),
+      "An error occurred during composing a VEXStream:\n" + place +
+          "XML cannot carry the text 'a\xFF'");
   for (const Recipe& recipe :
        {Recipe({}, "a\x01", 0, "", {}), Recipe(With({{"k", "\x01"}}), "", 0, "", {})}) {
-    EXPECT_TRUE(MessageOf<VexException>([&] { XmlOf(failing(Shared(recipe))); })
-                    .starts_with(internal + place));
+    EXPECT_TRUE(MessageOf<VexException>([&] {
+                  XmlOf(failing(Shared(recipe)));
+                }).starts_with(internal + place));
   }
   const UnknownSampleAttribute::Data tree(new DataTree(DataItem("1x", "")));
   EXPECT_TRUE(MessageOf<VexException>([&] {

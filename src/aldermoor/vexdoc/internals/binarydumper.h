@@ -15,11 +15,11 @@ namespace Aldermoor::Vexdoc::Internals {
 
 /// Writes a document in the binary format of the cache.
 ///
-/// Serves one document.  Every element that is visited writes its record and lets its children follow.  Derived
-/// attributes have none.  The conditions of the attributes written come last, in the order of the
-/// IDs' texts.
-/// Throws: NullPointerException for an attribute without conditions; LengthException for a text or
-/// a count that does not fit into 32 bits.  Failures of the stream are left to its owner.
+/// Serves one document.  Every element that is visited writes its record and lets its children
+/// follow.  Derived attributes have none.  The conditions of the attributes written come last, in
+/// the order of the IDs' texts. Throws: NullPointerException for an attribute without conditions;
+/// LengthException for a text or a count that does not fit into 32 bits.  Failures of the stream
+/// are left to its owner.
 class BinaryDumper : public ElementVisitor {
  public:
   /// `out` is kept by reference.

@@ -20,7 +20,8 @@ bool IsUsable(const std::string& id) {
 
 bool HaveEqualBits(const std::vector<float>& first, const std::vector<float>& second) {
   return first.size() == second.size() &&
-         (first.empty() || std::memcmp(first.data(), second.data(), first.size() * sizeof(float)) == 0);
+         (first.empty() ||
+          std::memcmp(first.data(), second.data(), first.size() * sizeof(float)) == 0);
 }
 
 // All that a file holds of a block, and to the bit: unlike the equality of conditions, which passes
@@ -30,9 +31,8 @@ bool HaveEqualContent(const Conditions& first, const Conditions& second) {
       first.HasCustomIllumination() != second.HasCustomIllumination()) {
     return false;
   }
-  return !first.HasCustomIllumination() ||
-         HaveEqualBits(first.GetCustomIllumination().GetData(),
-                       second.GetCustomIllumination().GetData());
+  return !first.HasCustomIllumination() || HaveEqualBits(first.GetCustomIllumination().GetData(),
+                                                         second.GetCustomIllumination().GetData());
 }
 
 }  // namespace

@@ -39,7 +39,7 @@ class ConditionTable {
   std::string MakeFreeId();
 
   Blocks blocks_;
-  std::unordered_map<const Conditions*, Entry> entries_;  // by object
+  std::unordered_map<const Conditions*, Entry> entries_;    // by object
   std::unordered_multimap<std::size_t, Entry> by_content_;  // by a hash
   unsigned long last_free_id_ = 0;
   // Attributes mostly come in runs under one block.

@@ -310,10 +310,10 @@ void DocumentChecker::CheckRange(const Conditions& conditions) {
 
 void DocumentChecker::CheckSteps(const std::string& whose, const Conditions& conditions,
                                  std::size_t points) {
-  const std::string values =
-      Counted(points, "value") + whose + " from " +
-      Quoted(conditions.GetAttribute(ConditionKeys::kWavelengthMin, "380")) + " to " +
-      Quoted(conditions.GetAttribute(ConditionKeys::kWavelengthMax, "730"));
+  const std::string values = Counted(points, "value") + whose + " from " +
+                             Quoted(conditions.GetAttribute(ConditionKeys::kWavelengthMin, "380")) +
+                             " to " +
+                             Quoted(conditions.GetAttribute(ConditionKeys::kWavelengthMax, "730"));
   try {
     const WavelengthSteps steps(conditions, points);
     const std::int64_t last = steps.first + steps.step * (static_cast<std::int64_t>(points) - 1);
@@ -390,7 +390,8 @@ void DocumentChecker::CheckTreeHeader(const Header& header, const DataTree& tree
                              ? !IsDate(key) && !(value.empty() && IsStandardKey(key))
                              : found->second && *found->second != value;
     if (is_lost) {
-      Add("the header value " + Quoted(key) + " is not what the content says, which alone is "
+      Add("the header value " + Quoted(key) +
+          " is not what the content says, which alone is "
           "written");
     }
   }
@@ -416,7 +417,9 @@ void DocumentChecker::CheckNumber(const std::string& what, float value) {
 }
 
 void DocumentChecker::CheckNumbers(const std::string& what, const std::vector<float>& values) {
-  const auto is_bad = [](float value) { return !std::isfinite(value); };
+  const auto is_bad = [](float value) {
+    return !std::isfinite(value);
+  };
   const auto first = std::find_if(values.begin(), values.end(), is_bad);
   if (first == values.end()) {
     return;

@@ -19,13 +19,12 @@ namespace Aldermoor::Vexdoc::Internals {
 
 /// Builds the DOM of a document in the current dialect.
 ///
-/// Serves one document.  The Visit operation of an element's class leaves the DOM element in the current node.  Derived
-/// attributes are left out.  The condition blocks of those that are written come last, each once,
-/// in the order of the IDs' texts.
-/// Throws: VexException for text that is not in the code page; XMLFailure for characters that XML
-/// does not have and names that are none; InvalidArgumentException for wavelengths that are no
-/// numbers; NullPointerException for an attribute without conditions.  VisitVex puts the set and the
-/// sample in front of the message.
+/// Serves one document.  The Visit operation of an element's class leaves the DOM element in the
+/// current node.  Derived attributes are left out.  The condition blocks of those that are written
+/// come last, each once, in the order of the IDs' texts. Throws: VexException for text that is not
+/// in the code page; XMLFailure for characters that XML does not have and names that are none;
+/// InvalidArgumentException for wavelengths that are no numbers; NullPointerException for an
+/// attribute without conditions.  VisitVex puts the set and the sample in front of the message.
 class XMLComposer : public ElementVisitor {
  public:
   /// `document` makes all nodes and is kept by reference.
