@@ -1,6 +1,7 @@
 #include "aldermoor/vexdoc/conditions.h"
 
 #include <gtest/gtest.h>
+#include <pthread.h>
 
 #include "aldermoor/vexdoc/recipe.h"
 
@@ -122,20 +123,41 @@ TEST(ConditionsTest, ABlockCanTakeOverTheConditionsOfItsOwnCurve) {
   EXPECT_FALSE(block->HasCustomIllumination());
 }
 
+// On a stack that holds a few thousand calls at most.
+void RunOnSmallStack(void (*body)()) {
+  constexpr std::size_t kStackBytes = 256 * 1024;
+  pthread_attr_t attributes;
+  pthread_attr_init(&attributes);
+  pthread_attr_setstacksize(&attributes, kStackBytes);
+  pthread_t thread{};
+  ASSERT_EQ(pthread_create(
+                &thread, &attributes,
+                [](void* argument) -> void* {
+                  (*static_cast<void (**)()>(argument))();
+                  return nullptr;
+                },
+                &body),
+            0);
+  pthread_join(thread, nullptr);
+  pthread_attr_destroy(&attributes);
+}
+
 TEST(ConditionsTest, CurvesOfCurvesAreComparedAndFreedHoweverManyThereAre) {
-  constexpr int kMany = 100'000;
-  const auto chain = [](float innermost) {
-    SmartPointer<Conditions> block = Around(SmartPointer<Conditions>(new Conditions), innermost);
-    for (int i = 0; i < kMany; ++i) {
-      block = Around(block);
-    }
-    return block;
-  };
-  const auto one = chain(1);
-  EXPECT_TRUE(*one == *chain(1));
-  EXPECT_FALSE(*one == *chain(2)) << "the values of the innermost curve";
-  EXPECT_TRUE(one->IsSubsetOf(*chain(1)));
-  EXPECT_FALSE(*one == *Around(one)) << "one curve more";
+  RunOnSmallStack([] {
+    const auto chain = [](float innermost) {
+      constexpr int kMany = 20'000;
+      SmartPointer<Conditions> block = Around(SmartPointer<Conditions>(new Conditions), innermost);
+      for (int i = 0; i < kMany; ++i) {
+        block = Around(block);
+      }
+      return block;
+    };
+    const auto one = chain(1);
+    EXPECT_TRUE(*one == *chain(1));
+    EXPECT_FALSE(*one == *chain(2)) << "the values of the innermost curve";
+    EXPECT_TRUE(one->IsSubsetOf(*chain(1)));
+    EXPECT_FALSE(*one == *Around(one)) << "one curve more";
+  });
   const SmartPointer<Conditions> nothing = Around({});
   EXPECT_THROW((void)(*nothing == *Around({})), NullPointerException);
 }
