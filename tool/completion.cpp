@@ -11,7 +11,6 @@
 #include <fmt/ranges.h>
 
 #include "aldermoor/vexdoc/colorvector.h"
-#include "aldermoor/vexdoc/recipe.h"
 #include "aldermoor/vexdoc/spectrum.h"
 
 #include "diagnostics.h"
@@ -117,8 +116,7 @@ class Completion {
                          kind.one, fmt::join(missing, ", "));
     }
     if (!(conditions == *attribute.GetConditions())) {
-      // Any attribute that is built from conditions gets the block that all of them share.
-      attribute.SetConditions(Vexdoc::Recipe(conditions, "", 0.0F, "", {}).GetConditions());
+      attribute.SetConditions(Vexdoc::SharedConditions(conditions));
     }
     return "";
   }

@@ -1,5 +1,6 @@
 #include "xmldocument.h"
 
+#include <algorithm>
 #include <exception>
 #include <filesystem>
 #include <map>
@@ -10,14 +11,13 @@
 #include "aldermoor/utilities/exceptions/exceptions.h"
 #include "aldermoor/utilities/filesystem/file.h"
 #include "aldermoor/utilities/tools/datetime.h"
-#include "aldermoor/vexdoc/spectrum.h"
+#include "aldermoor/vexdoc/inspection.h"
 #include "aldermoor/vexdoc/vexexception.h"
 
 #include "diagnostics.h"
 #include "documentdiff.h"
 #include "inputfile.h"
 #include "output.h"
-#include "settings.h"
 
 namespace Aldermoor::Tool {
 namespace {
@@ -67,45 +67,26 @@ void Parse(const std::string& path, const std::string& text, Vexdoc::VEX& docume
   }
 }
 
-// Why XML of `spectrum` would not be read again; empty if it would.
-std::string SpectrumFault(const Vexdoc::Spectrum& spectrum) {
-  const Vexdoc::Conditions& conditions = *spectrum.GetConditions();
-  const std::size_t points = spectrum.GetData().size();
-  const std::string count = conditions.GetAttribute(kPointCountKey, "36");
-  const std::string first = conditions.GetAttribute(kWavelengthMinKey, "380nm");
-  const std::string last = conditions.GetAttribute(kWavelengthMaxKey, "730nm");
-  if (count != std::to_string(points)) {
-    return fmt::format("a spectrum of {} values under conditions that name {}", points, count);
+// Tells what a file would not bring back; whether there is nothing of the kind.
+bool IsSavable(const Vexdoc::VEX& document, const std::string& shown) {
+  constexpr std::size_t kMostReported = 100;
+  const std::vector<Vexdoc::DocumentFault> faults = Vexdoc::CheckDocument(document);
+  for (std::size_t i = 0; i < std::min(faults.size(), kMostReported); ++i) {
+    Report(faults[i].GetText());
   }
-  if (!Wavelength(first) || !Wavelength(last)) {
-    return fmt::format("a spectrum from '{}' to '{}', no whole wavelengths", first, last);
+  if (!faults.empty()) {
+    Report(fmt::format("{}: XML cannot carry the document: {} fault{}; nothing is written", shown,
+                       faults.size(), faults.size() == 1 ? "" : "s"));
   }
-  const int range = *Wavelength(last) - *Wavelength(first);
-  if (points > 1 && range < static_cast<int>(points) - 1) {
-    return fmt::format("{} values from {} to {} would get equal or falling wavelengths", points,
-                       first, last);
-  }
-  return "";
-}
-
-// What the library's message does not say.
-void ReportFaultySpectra(const Vexdoc::VEX& document) {
-  for (const auto& [set_key, set] : document.GetSampleSets()) {
-    for (const auto& [sample_key, sample] : set->GetSamples()) {
-      for (const auto& [key, attribute] : sample->GetElements()) {
-        const auto* const spectrum = dynamic_cast<const Vexdoc::Spectrum*>(attribute.Get());
-        const std::string fault = spectrum == nullptr ? "" : SpectrumFault(*spectrum);
-        if (!fault.empty()) {
-          Report(
-              fmt::format("set '{}', sample '{}': {}", set->GetName(), sample->GetName(), fault));
-        }
-      }
-    }
-  }
+  return faults.empty();
 }
 
 // The text, if it gives the same document again; else empty, and everything was told.
 std::string CheckedText(const Vexdoc::VEX& document, const std::string& shown, bool tell_digits) {
+  if (!IsSavable(document, shown)) {
+    return "";
+  }
+  // What is written is read again all the same: a second net, and it counts the digits.
   std::ostringstream out;
   Vexdoc::VEX again;
   try {
@@ -113,7 +94,6 @@ std::string CheckedText(const Vexdoc::VEX& document, const std::string& shown, b
     std::istringstream in(out.str());
     again.Load(in);
   } catch (const std::exception& e) {
-    ReportFaultySpectra(document);
     Report(
         fmt::format("{}: XML cannot carry the document: {}; nothing is written", shown, e.what()));
     return "";

@@ -37,8 +37,9 @@ from aldermoor._errors import (
     MissingFileError,
     NotFoundError,
     ParseError,
+    SaveError,
 )
-from aldermoor._results import ColorRendering, Item, SampleRows
+from aldermoor._results import ColorRendering, Fault, Item, SampleRows
 from aldermoor._words import (
     COLOR_SPACES,
     DENSITY_STANDARDS,
@@ -60,6 +61,7 @@ __all__ = [
     "ColorVector",
     "Document",
     "Error",
+    "Fault",
     "FileError",
     "Item",
     "MeasureError",
@@ -71,6 +73,7 @@ __all__ = [
     "Sample",
     "SampleRows",
     "SampleSet",
+    "SaveError",
     "Spectrum",
     "__version__",
     "channels",

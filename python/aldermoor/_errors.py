@@ -2,6 +2,11 @@
 
 from __future__ import annotations
 
+from typing import TYPE_CHECKING
+
+if TYPE_CHECKING:
+    from aldermoor._results import Fault
+
 
 class Error(Exception):
     """A failure of the library; the text says why."""
@@ -28,6 +33,16 @@ class ParseError(Error, ValueError):
     file: str | None = None
     line: int | None = None
     column: int | None = None
+
+
+class SaveError(Error, ValueError):
+    """A document is not written, since a file would not bring it back as it is.
+
+    The text has a line for each fault, up to a hundred.
+    """
+
+    faults: tuple[Fault, ...] = ()
+    """All of them, in the order of the document."""
 
 
 class NotFoundError(Error, LookupError):

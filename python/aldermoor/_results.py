@@ -20,6 +20,17 @@ class SampleRows(NamedTuple):
     """The sets that hold them."""
 
 
+class Fault(NamedTuple):
+    """Something in a document that a file would not bring back."""
+
+    set: str
+    """The name of the sample set; empty for what belongs to the document itself."""
+    sample: str
+    attribute: str
+    """Kind and name, or kind and number from 1: "Spectrum 'M0'", "ColorVector 2"; or empty."""
+    reason: str
+
+
 class ColorRendering(NamedTuple):
     """The general colour rendering index of CIE 13.3-1995, an entry for each light."""
 

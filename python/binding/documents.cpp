@@ -16,6 +16,7 @@
 
 #include "aldermoor/utilities/exceptions/exceptions.h"
 #include "aldermoor/vexdoc/colorvector.h"
+#include "aldermoor/vexdoc/inspection.h"
 #include "aldermoor/vexdoc/spectrum.h"
 #include "aldermoor/vexdoc/vex.h"
 #include "aldermoor/vexdoc/vexexception.h"
@@ -119,13 +120,24 @@ void Save(const VEX& document, const py::object& given, bool cache) {
   const LibraryLock lock;
   try {
     File file(path.bytes);
-    document.SaveXML(file, cache);
+    Vexdoc::SaveCheckedXML(document, file, cache);
+  } catch (const Vexdoc::UnsavableDocumentException& e) {
+    ThrowSaveError(e);
   } catch (const ResourceNotAvailableException& e) {
     if (const int error = ErrorOfWriting(e.what())) {
       ThrowFileError(error, path.name, &e);
     }
     ThrowAs("FileError", e);
   }
+}
+
+py::list Faults(const VEX& document) {
+  std::vector<Vexdoc::DocumentFault> faults;
+  {
+    const LibraryAlone library;
+    faults = Vexdoc::CheckDocument(document);
+  }
+  return ToFaults(faults);
 }
 
 py::bytes Dumps(const VEX& document) {
@@ -383,12 +395,20 @@ Adds an empty set and returns it; its name has a number behind it if `name` was 
 Writes the document as XML; with `cache`, a binary cache beside it too.
 
 Values are written with six significant digits.  The file is replaced as a whole, or stays as it
-was.  Raises FileError.)",
+was.  Raises FileError, or SaveError with the `faults` of a document that could not be read again or
+would come back as another one; then no file is touched.)",
            arg("path"), arg("cache") = false);
   type.def("dumps", &Dumps, R"(dumps(self)
 --
 
-The document as XML in UTF-8, as `save` writes it: values have six significant digits.)");
+The document as XML in UTF-8, as `save` writes it: values have six significant digits.
+
+It is not checked: `faults` tells what would not come back.)");
+  type.def("faults", &Faults, R"(faults(self)
+--
+
+What a file would not bring back, as a list of Fault: counts that differ from the values, conditions
+that are missing, NaN.  Empty for a document that `save` writes.)");
 }
 
 }  // namespace

@@ -1,5 +1,6 @@
 #include "errors.h"
 
+#include <algorithm>
 #include <cerrno>
 #include <exception>
 #include <string>
@@ -31,7 +32,7 @@ py::tuple TraceOf(const TraceableException& failure) {
 }
 
 // A message may quote bytes of a damaged file.
-py::object TextOf(const char* message) {
+py::object TextOf(const std::string& message) {
   return py::bytes(message).attr("decode")("utf-8", "replace");
 }
 
@@ -65,7 +66,7 @@ void Translate(std::exception_ptr thrown) {
     PyErr_NoMemory();
   } catch (const Vexdoc::VexXMLParseException& e) {
     const py::object error = MakeError("ParseError", e);
-    error.attr("file") = TextOf(e.GetFile().c_str());
+    error.attr("file") = TextOf(e.GetFile());
     Set(error);
   } catch (const Vexdoc::VexParseException& e) {
     Set("ParseError", e);
@@ -89,6 +90,33 @@ void Translate(std::exception_ptr thrown) {
 void ThrowAs(const char* name, const TraceableException& failure) {
   Set(name, failure);
   throw py::error_already_set();
+}
+
+void ThrowSaveError(const Vexdoc::UnsavableDocumentException& failure) {
+  constexpr std::size_t kMostTold = 100;
+  const std::vector<Vexdoc::DocumentFault>& faults = failure.GetFaults();
+  std::string text = "the document cannot be saved as it is:";
+  for (std::size_t i = 0; i < std::min(faults.size(), kMostTold); ++i) {
+    text += "\n" + faults[i].GetText();
+  }
+  if (faults.size() > kMostTold) {
+    text += "\nand " + std::to_string(faults.size() - kMostTold) + " more";
+  }
+  const py::object error = ClassOf("SaveError")(TextOf(text));
+  error.attr("trace") = TraceOf(failure);
+  error.attr("faults") = py::tuple(ToFaults(faults));
+  Set(error);
+  throw py::error_already_set();
+}
+
+py::list ToFaults(const std::vector<Vexdoc::DocumentFault>& faults) {
+  const py::object type = py::module_::import("aldermoor._results").attr("Fault");
+  py::list list;
+  for (const Vexdoc::DocumentFault& fault : faults) {
+    list.append(type(TextOf(fault.set), TextOf(fault.sample), TextOf(fault.attribute),
+                     TextOf(fault.reason)));
+  }
+  return list;
 }
 
 void ThrowFileError(int error, const py::object& path, const TraceableException* failure) {

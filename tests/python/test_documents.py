@@ -1,6 +1,7 @@
 """Documents: read, walked, built, written."""
 
 import gc
+import pickle
 from pathlib import Path
 
 import numpy
@@ -81,6 +82,35 @@ def test_what_is_built_comes_back_from_a_file(tmp_path: Path) -> None:
     assert (tmp_path / "Cache" / "rampTrue.vexb").exists()
     assert not (tmp_path / "Cache" / "rampFalse.vexb").exists()
     assert aldermoor.loads(document.dumps()).dumps() == document.dumps()
+
+
+def test_what_a_file_would_not_bring_back_is_not_saved(tmp_path: Path) -> None:
+    document = aldermoor.Document()
+    sample = document.add_set("s").add_sample("t")
+    span = {"Physical.WavelengthSpectrumMin": "400nm", "Physical.WavelengthSpectrumMax": "700nm"}
+    sample.add_spectrum(numpy.ones(31), span)
+    assert document.faults() == []
+    document.save(tmp_path / "a.xml")
+    good = (tmp_path / "a.xml").read_bytes()
+    sample.add_spectrum(numpy.ones(31), span | {"Physical.NumberOfDataPointsSpectrum": "36"})
+    sample.add_spectrum(numpy.ones(36), {"Physical.WavelengthSpectrumMax": "400nm"})
+    sample.set_header("Note", "\x01")
+    with pytest.raises(aldermoor.SaveError, match="set 's', sample 't', Spectrum 2: ") as caught:
+        document.save(tmp_path / "a.xml", cache=True)
+    assert [(f.attribute, f.reason) for f in caught.value.faults] == [
+        ("", "the header value 'Note': XML cannot carry the text '\x01'"),
+        ("Spectrum 2", "31 values under conditions that name 36"),
+        (
+            "Spectrum 3",
+            "36 values from '380nm' to '400nm' would get equal or falling wavelengths: the step "
+            "is in whole nm",
+        ),
+    ]
+    assert tuple(document.faults()) == caught.value.faults
+    assert len(str(caught.value).splitlines()) == 4 and caught.value.trace
+    assert (tmp_path / "a.xml").read_bytes() == good and not (tmp_path / "Cache").exists()
+    again = pickle.loads(pickle.dumps(caught.value))
+    assert again.faults == caught.value.faults
 
 
 def test_names_stay_unique_and_elements_can_go() -> None:

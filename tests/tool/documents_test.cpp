@@ -54,6 +54,43 @@ TEST_F(DocumentsTest, NothingIsWrittenFromWhatCannotBeReadOrDoesNotMatch) {
   }
 }
 
+TEST_F(DocumentsTest, WhatAFileWouldNotBringBackIsToldForEverySampleAndNothingIsWritten) {
+  const std::string spectrum = "'><Value Name='1'>0.5</Value><Value Name='2'>1</Value></Spectrum>";
+  const std::string color = "'><Value Name='1'>3</Value><Value Name='2'>4</Value></ColorVector>";
+  const auto sample = [](const std::string& name, const std::string& attribute) {
+    return "<Sample><Name>" + name + "</Name><SampleAttribute>" + attribute +
+           "</SampleAttribute></Sample>";
+  };
+  const auto block = [](const char* id, const char* key, const char* value) {
+    return std::string("<Conditions><ID>") + id + "</ID><Attribute Name='" + key + "'>" + value +
+           "</Attribute></Conditions>";
+  };
+  WriteFile("l.xml", "<VEX><Name/><SampleSet><Name>S</Name>" +
+                         sample("count", "<Spectrum Conditions='1" + spectrum) +
+                         sample("range", "<Spectrum Conditions='2" + spectrum) +
+                         sample("colour", "<ColorVector Conditions='3" + color) + "</SampleSet>" +
+                         block("1", "Physical.SpectrumType", "Flash") +
+                         block("2", "Physical.WavelengthSpectrumMin", "0.73um") +
+                         block("3", "ColorSpaceDescription.Type", "RGB") + "</VEX>");
+  for (const char* const command :
+       {"merge a.xml l.xml -o old.xml", "extract l.xml --set S -o old.xml"}) {
+    const Result result = Run(command);
+    EXPECT_EQ(result.status, 1) << command;
+    for (const char* const fault :
+         {"set 'S', sample 'count', Spectrum 1: 2 values under conditions that name 36\n",
+          "set 'S', sample 'range', Spectrum 1: 2 values under conditions that name 36\n",
+          "set 'S', sample 'range', Spectrum 1: the first wavelength, '0.73um', would be written "
+          "as "
+          "0\n",
+          "set 'S', sample 'colour', ColorVector 1: Inconsistent ColorVector-size(expected 3 but "
+          "got 2 elements for colorspace RGB)\n",
+          "old.xml: XML cannot carry the document: 4 faults; nothing is written\n"}) {
+      EXPECT_TRUE(Holds(result.err, fault)) << command << "\n" << result.err;
+    }
+    EXPECT_EQ(ReadFile("old.xml"), "old") << command;
+  }
+}
+
 TEST_F(DocumentsTest, ExtractKeepsWhatPassesAndTheHeader) {
   ASSERT_EQ(Run("merge a.xml b.xml -o all.xml").status, 0);
   EXPECT_EQ(Run("extract all.xml --sample y -o y.xml").status, 0);

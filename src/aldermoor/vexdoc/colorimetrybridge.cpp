@@ -50,6 +50,26 @@ SmartPointer<Conditions> ToBlock(const HXMeasureConditions& conditions) {
   return manager.GetOrCreateConditions(ToConditions(conditions));
 }
 
+// Curves that are the illuminants of curves: further ones mean nothing to any colour.
+constexpr std::size_t kMostNestedCurves = 100;
+
+// `of_curve` are the conditions of the custom illumination, where the attributes refer to it.
+HXMeasureConditions ReadWords(const Conditions& conditions, const HXMeasureConditions* of_curve) {
+  HXMeasureConditions result;
+  for (const auto& [key, value] : conditions.GetAttributes()) {
+    try {
+      result.SetMeasureCondition(key, value);
+      if (of_curve != nullptr && key == kIlluminationKey) {
+        result.SetUserdefinedIllumination(
+            HXSpectrum(conditions.GetCustomIllumination().GetData(), *of_curve));
+      }
+    } catch (const TristimException&) {
+      // Documents hold keys and words of their own; colorimetry keeps its default for them.
+    }
+  }
+  return result;
+}
+
 SmartPointer<SampleAttribute> Derived(const HXColorVector& vector) {
   SmartPointer<SampleAttribute> result = ToColorVector(vector);
   result->SetDerived(true);
@@ -76,16 +96,25 @@ const std::vector<std::string>& GetChannelLabels(const std::string& color_space)
 ALDERMOOR_FRAME(Aldermoor::Vexdoc::GetChannelLabels)
 
 HXMeasureConditions ToMeasureConditions(const Conditions& conditions) try {
-  HXMeasureConditions result;
-  for (const auto& [key, value] : conditions.GetAttributes()) {
-    try {
-      result.SetMeasureCondition(key, value);
-      if (conditions.HasCustomIllumination() && key == kIlluminationKey && value == kUserdefined) {
-        result.SetUserdefinedIllumination(ToHXSpectrum(conditions.GetCustomIllumination()));
-      }
-    } catch (const TristimException&) {
-      // Documents hold keys and words of their own; colorimetry keeps its default for them.
-    }
+  if (!conditions.RefersToCustomIllumination()) {
+    return ReadWords(conditions, nullptr);
+  }
+  // The conditions of a curve may have a curve again.  From the innermost outward, since a ring of
+  // them has no end: the block with which it would go round again counts without its illuminant.
+  std::vector<const Conditions*> blocks;
+  const Conditions* next = &conditions;
+  while (next->RefersToCustomIllumination() && blocks.size() < kMostNestedCurves &&
+         std::find(blocks.begin(), blocks.end(), next) == blocks.end()) {
+    blocks.push_back(next);
+    next = &*next->GetCustomIllumination().GetConditions();
+  }
+  Conditions innermost(*next);
+  if (next->RefersToCustomIllumination()) {
+    innermost.RemoveAttribute(kIlluminationKey);
+  }
+  HXMeasureConditions result = ReadWords(innermost, nullptr);
+  for (auto block = blocks.rbegin(); block != blocks.rend(); ++block) {
+    result = ReadWords(**block, &result);
   }
   return result;
 }

@@ -51,13 +51,18 @@ class ALDERMOOR_EXPORT Conditions final : public DeprecatedConditionsInterface<0
 
   std::string GetID() const override;
   bool HasCustomIllumination() const override;
+  /// Whether there is one and the attributes refer to it: the illumination is "Userdefined".
+  bool RefersToCustomIllumination() const;
   /// Throws: ResourceNotAvailableException if there is none.
   const Spectrum& GetCustomIllumination() const override;
   /// Keeps a copy of `spectrum`; the attributes stay as they are.
+  ///
+  /// A block whose curve, directly or over others, has the block itself as its conditions works,
+  /// but is never freed: the two hold each other.
   void SetCustomIllumination(const Spectrum& spectrum) override;
 
   /// Stores the value and returns the one it replaces, or the empty string.  An empty key is
-  /// ignored.
+  /// ignored.  Both may be parts of this object.
   std::string AddAttribute(const std::string& key, const std::string& value);
   /// Throws: ResourceNotAvailableException if the key is missing.
   std::string GetAttribute(const std::string& key) const;
@@ -98,6 +103,23 @@ class ALDERMOOR_EXPORT Conditions final : public DeprecatedConditionsInterface<0
   bool is_shared_ = false;
   static unsigned long changes_of_shared_;
 };
+
+/// The block of this content that all attributes of the process share, made if there is none; what
+/// SampleAttribute::SetConditions takes.
+///
+/// It is the block that an attribute built from `conditions` gets.  Whoever changes it changes it
+/// for everybody.  Its ID is given by the process. Shared state: the blocks of the process.
+ALDERMOOR_EXPORT Utilities::Tools::SmartPointer<Conditions> SharedConditions(
+    const Conditions& conditions);
+
+/// Frees the blocks that no attribute, curve or application holds any more, and returns how many
+/// there were.
+///
+/// The library never does so by itself: a process that goes through many documents whose conditions
+/// differ, by a time stamp say, calls this between them.  A block that 65,535 pointers have held at
+/// one time stays for ever (SmartPointer), and so does one that its own curve holds.
+/// Shared state: the blocks of the process.
+ALDERMOOR_EXPORT unsigned long ReleaseUnusedConditions();
 
 }  // namespace Aldermoor::Vexdoc
 

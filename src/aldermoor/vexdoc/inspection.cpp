@@ -8,7 +8,10 @@
 #include "aldermoor/utilities/filesystem/posix/filecontent.h"
 #include "aldermoor/vexdoc/internals/cachedump.h"
 #include "aldermoor/vexdoc/internals/cachewalker.h"
+#include "aldermoor/vexdoc/internals/documentchecker.h"
+#include "aldermoor/vexdoc/internals/faulttext.h"
 #include "aldermoor/vexdoc/internals/xmlchecker.h"
+#include "aldermoor/vexdoc/vex.h"
 
 namespace Aldermoor::Vexdoc {
 
@@ -30,6 +33,14 @@ Bytes ReadAll(std::istream& in) {
 
 Bytes ReadAll(const File& file) {
   return Platform::Posix::ReadFileContent(file.GetAbsolutePlatformName());
+}
+
+std::string MessageOf(const std::vector<DocumentFault>& faults) {
+  std::string text = "The document cannot be saved as it is: " + faults.front().GetText();
+  if (faults.size() > 1) {
+    text += " (the first of " + std::to_string(faults.size()) + " faults)";
+  }
+  return text;
 }
 
 std::string_view View(const Bytes& bytes) {
@@ -65,5 +76,28 @@ bool DumpCache(std::istream& in, std::ostream& out) try {
   return Internals::CacheDump(View(bytes), out).Write();
 }
 ALDERMOOR_FRAME(Aldermoor::Vexdoc::DumpCache)
+
+std::string DocumentFault::GetText() const try {
+  return Internals::PlaceText(set, sample, attribute) + reason;
+}
+ALDERMOOR_FRAME(Aldermoor::Vexdoc::DocumentFault::GetText)
+
+std::vector<DocumentFault> CheckDocument(const VEX& document) try {
+  return Internals::DocumentChecker().Check(document);
+}
+ALDERMOOR_FRAME(Aldermoor::Vexdoc::CheckDocument)
+
+UnsavableDocumentException::UnsavableDocumentException(const std::vector<DocumentFault>& faults,
+                                                       const std::string& location)
+    : VexException(MessageOf(faults), location), faults_(faults) {}
+
+void SaveCheckedXML(const VEX& document, File& file, bool updateCache) try {
+  const std::vector<DocumentFault> faults = CheckDocument(document);
+  if (!faults.empty()) {
+    throw UnsavableDocumentException(faults, ALDERMOOR_HERE(Aldermoor::Vexdoc::SaveCheckedXML));
+  }
+  document.SaveXML(file, updateCache);
+}
+ALDERMOOR_FRAME(Aldermoor::Vexdoc::SaveCheckedXML)
 
 }  // namespace Aldermoor::Vexdoc

@@ -7,10 +7,13 @@
 
 #include "aldermoor/export.h"
 #include "aldermoor/utilities/filesystem/file.h"
+#include "aldermoor/vexdoc/vexexception.h"
 
-/// Checks of files for people who want to know everything that is wrong with one, where a load
-/// tells the first fault only.
+/// Checks of files, for people who want to know everything that is wrong with one where a load
+/// tells the first fault only, and of documents before they become files.
 namespace Aldermoor::Vexdoc {
+
+class VEX;
 
 /// Something in a file that is against the rules of its format.
 struct Fault {
@@ -56,6 +59,52 @@ ALDERMOOR_EXPORT std::vector<Fault> CheckCache(std::istream& in);
 /// Ends at the first fault behind which the next field cannot be found, with a line that tells it.
 /// Returns whether there was none.
 ALDERMOOR_EXPORT bool DumpCache(std::istream& in, std::ostream& out);
+
+/// Something in a document that a file would not bring back.
+struct DocumentFault {
+  /// The names of the sample set and the sample; empty above them.
+  std::string set;
+  std::string sample;
+  /// The kind of the attribute and its name, or its number, counted from 1, if it has none:
+  /// "Spectrum 'M0'", "ColorVector 2".  Empty for what belongs to no attribute.
+  std::string attribute;
+  /// One line of plain words.
+  std::string reason;
+
+  /// "set 'x', sample 'y', Spectrum 1: " and the reason.
+  ALDERMOOR_EXPORT std::string GetText() const;
+};
+
+/// The faults of a document in the order of its elements: whatever VEX::SaveXML would refuse, a
+/// load of the file would refuse, or would come back as something else.
+///
+/// A document without faults is read again with the same content, but for what docs/xmlformat.md
+/// names: digits beyond the sixth, derived attributes, dates that were not there.  What is wrong
+/// with a condition block is told at the first attribute that holds it.  For the cache, which keeps
+/// every bit, the rules of conditions and of structure hold too.  The XML platform must be up.
+/// Shared state: none.
+/// Throws: VexException if the XML platform is not initialised.
+ALDERMOOR_EXPORT std::vector<DocumentFault> CheckDocument(const VEX& document);
+
+/// A document was not saved, since it has faults.  The message tells the first one and how many
+/// there are.
+class ALDERMOOR_EXPORT UnsavableDocumentException : public VexException {
+ public:
+  /// There must be a fault.
+  UnsavableDocumentException(const std::vector<DocumentFault>& faults, const std::string& location);
+
+  const std::vector<DocumentFault>& GetFaults() const { return faults_; }
+
+ private:
+  std::vector<DocumentFault> faults_;
+};
+
+/// VEX::SaveXML for documents without faults: what it writes can be read, and says the same.
+///
+/// Throws: UnsavableDocumentException if CheckDocument finds any fault, before a file is touched;
+/// what VEX::SaveXML throws.
+ALDERMOOR_EXPORT void SaveCheckedXML(const VEX& document, Utilities::FileSystem::File& file,
+                                     bool updateCache);
 
 }  // namespace Aldermoor::Vexdoc
 

@@ -54,6 +54,8 @@ class ALDERMOOR_EXPORT SampleAttribute : public DeprecatedSampleAttributeInterfa
   /// Takes over `other` if it is of the same class; else nothing changes.
   virtual SampleAttribute& Assign(const SampleAttribute& other) = 0;
   virtual bool Equals(const SampleAttribute& other) const = 0;
+  /// Takes the block itself; SharedConditions gives the one that attributes of equal conditions
+  /// share.  A block of one's own serves too, and is saved with what it holds.
   virtual void SetConditions(const Utilities::Tools::SmartPointer<Conditions>& conditions) = 0;
 };
 

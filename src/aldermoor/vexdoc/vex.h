@@ -46,8 +46,10 @@ class ALDERMOOR_EXPORT VEX
   ///
   /// What a load refuses is written all the same: spectra whose number of points is not that of
   /// their conditions, and colours of a legacy document without observer (docs/xmlformat.md).
+  /// SaveCheckedXML of inspection.h refuses it.
   /// Throws: VexException if the document holds text that XML cannot carry;
-  /// InvalidArgumentException for a range of wavelengths that is no number.
+  /// InvalidArgumentException for a range of wavelengths that is no number; NullPointerException
+  /// for an attribute without conditions.  The message names the set and the sample.
   void Store(std::ostream& out) const override;
   /// Replaces the content of this document by the XML read from `in`.  Its sets are removed first,
   /// and stay so if the text cannot be read.

@@ -63,6 +63,7 @@ class ALDERMOOR_EXPORT ExceptionAdapter : public StdExceptionAdapter<E>,
   const char* what() const noexcept override;
   const char* adapted_what() const noexcept override { return what(); }
   const char* traceable_what() const noexcept override;
+  void prepend(const std::string& context) override;
 
  private:
   mutable std::string text_;
@@ -96,6 +97,13 @@ const char* ExceptionAdapter<E>::traceable_what() const noexcept {
     return "bad typeid";
   } else {
     return E::what();
+  }
+}
+
+template <class E>
+void ExceptionAdapter<E>::prepend(const std::string& context) {
+  if constexpr (std::is_constructible_v<E, const std::string&>) {
+    E::operator=(E(context + E::what()));
   }
 }
 

@@ -37,6 +37,8 @@ TraceableException::TraceableException(const std::exception& cause, const std::s
 
 TraceableException::~TraceableException() = default;
 
+void TraceableException::prepend(const std::string& /*context*/) {}
+
 std::ostream& TraceableException::print_stack_trace(std::ostream& out) const {
   bool first = true;
   for (const std::string& location : where_) {

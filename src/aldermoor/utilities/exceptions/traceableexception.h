@@ -54,6 +54,10 @@ class ALDERMOOR_EXPORT TraceableException {
   /// The message; with use_implicite_stack_trace(true), the trace behind it.
   virtual const char* what() const noexcept = 0;
 
+  /// Puts `context` in front of the message of this very object, so that who catches it to say
+  /// where it happened can throw it on as what it is.  No effect on types that carry no text.
+  virtual void prepend(const std::string& context);
+
   std::list<std::string>& where() { return where_; }
   const std::list<std::string>& where() const { return where_; }
 

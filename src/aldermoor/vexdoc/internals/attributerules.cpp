@@ -25,6 +25,11 @@ void AddMissing(const Conditions& conditions, const std::vector<std::string>& ke
   }
 }
 
+// In nm; of "380nm" the number counts.
+std::int16_t Wavelength(const Conditions& conditions, const char* key, const char* fallback) {
+  return Utilities::Tools::lexical_cast<std::int16_t>(conditions.GetAttribute(key, fallback));
+}
+
 // The rules of the class itself, which nothing but its channels enters.
 template <class Data>
 void AddChannelFault(const std::string& color_space, const Data& data,
@@ -46,6 +51,14 @@ std::string ElementKind(const std::string& name) {
 
 bool IsLevel(std::string_view kind) {
   return kind == "VEX" || kind == "SampleSet" || kind == "Sample";
+}
+
+WavelengthSteps::WavelengthSteps(const Conditions& conditions, std::size_t points)
+    : first(Wavelength(conditions, ConditionKeys::kWavelengthMin, "380")) {
+  const std::int16_t last = Wavelength(conditions, ConditionKeys::kWavelengthMax, "730");
+  if (points > 1) {
+    step = (last - first) / (static_cast<std::int64_t>(points) - 1);
+  }
 }
 
 std::optional<unsigned int> ExpectedPoints(const Conditions& conditions) {

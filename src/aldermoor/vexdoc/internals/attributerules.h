@@ -2,6 +2,7 @@
 #define ALDERMOOR_VEXDOC_INTERNALS_ATTRIBUTERULES_H
 
 #include <cstddef>
+#include <cstdint>
 #include <optional>
 #include <string>
 #include <string_view>
@@ -21,6 +22,16 @@ inline constexpr std::size_t kIlluminationPoints = 36;
 std::string ElementKind(const std::string& name);
 /// Whether that is the kind of something that holds others, and so no attribute.
 bool IsLevel(std::string_view kind);
+
+/// The wavelengths under which XML holds the points of a spectrum: whole nm, from the range that
+/// `conditions` name (380 and 730 without) and a step that is rounded down.
+struct WavelengthSteps {
+  /// Throws: std::invalid_argument if the range is no number or does not fit into 16 bits.
+  WavelengthSteps(const Conditions& conditions, std::size_t points);
+
+  std::int64_t first;
+  std::int64_t step = 0;  // also of a single point
+};
 
 /// The number of points that the conditions of a spectrum name; none if that is no number.
 std::optional<unsigned int> ExpectedPoints(const Conditions& conditions);

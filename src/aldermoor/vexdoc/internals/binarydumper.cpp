@@ -10,7 +10,6 @@
 #include "aldermoor/vexdoc/colorvector.h"
 #include "aldermoor/vexdoc/elementtyper.h"
 #include "aldermoor/vexdoc/internals/binaryformat.h"
-#include "aldermoor/vexdoc/internals/conditionmanager.h"
 #include "aldermoor/vexdoc/recipe.h"
 #include "aldermoor/vexdoc/spectrum.h"
 #include "aldermoor/vexdoc/unknownsampleattribute.h"
@@ -66,9 +65,7 @@ void BinaryDumper::DumpSampleAttribute(Attribute& attribute) {
     return;
   }
   DumpHeader(attribute);
-  const std::string id = attribute.GetConditions()->GetID();
-  Write(id);
-  condition_ids_.insert(id);
+  Write(conditions_.GetId(*attribute.GetConditions()));
   DumpMembers(attribute);
 }
 
@@ -118,19 +115,14 @@ void BinaryDumper::DumpDataTree(const DataTree& tree) {
 }
 
 void BinaryDumper::DumpConditions() {
-  Write(condition_ids_.size());
-  for (const std::string& id : condition_ids_) {
-    DumpCondition(id);
-  }
-}
-
-void BinaryDumper::DumpCondition(const std::string& id) {
-  const ConditionManager::Block block = ConditionManager::GetInstance().GetConditions(id);
-  Write(block->GetID());
-  Write(block->GetAttributes());
-  Write(block->HasCustomIllumination() ? 1UL : 0UL);
-  if (block->HasCustomIllumination()) {
-    Write(block->GetCustomIllumination().GetData());
+  Write(conditions_.GetBlocks().size());
+  for (const auto& [id, block] : conditions_.GetBlocks()) {
+    Write(id);
+    Write(block->GetAttributes());
+    Write(block->HasCustomIllumination() ? 1UL : 0UL);
+    if (block->HasCustomIllumination()) {
+      Write(block->GetCustomIllumination().GetData());
+    }
   }
 }
 

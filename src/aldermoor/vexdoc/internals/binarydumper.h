@@ -3,23 +3,23 @@
 
 #include <iosfwd>
 #include <map>
-#include <set>
 #include <string>
 #include <vector>
 
 #include "aldermoor/vexdoc/dataitem.h"
 #include "aldermoor/vexdoc/elementvisitor.h"
+#include "aldermoor/vexdoc/internals/conditiontable.h"
 #include "aldermoor/vexdoc/vex.h"
 
 namespace Aldermoor::Vexdoc::Internals {
 
 /// Writes a document in the binary format of the cache.
 ///
-/// Every element that is visited writes its record and lets its children follow.  Derived
-/// attributes have none.  The conditions of the attributes written come last, in the order of the
-/// IDs' texts.
-/// Throws: NullPointerException for an attribute without conditions; LengthException for a text or
-/// a count that does not fit into 32 bits.  Failures of the stream are left to its owner.
+/// Serves one document.  Every element that is visited writes its record and lets its children
+/// follow.  Derived attributes have none.  The conditions of the attributes written come last, in
+/// the order of the IDs' texts. Throws: NullPointerException for an attribute without conditions;
+/// LengthException for a text or a count that does not fit into 32 bits.  Failures of the stream
+/// are left to its owner.
 class BinaryDumper : public ElementVisitor {
  public:
   /// `out` is kept by reference.
@@ -41,7 +41,6 @@ class BinaryDumper : public ElementVisitor {
   void DumpSampleAttribute(Attribute& attribute);
   void DumpHeader(Header& header);
   void DumpConditions();
-  void DumpCondition(const std::string& id);
   void DumpDataTree(const DataTree& tree);
 
   void DumpMembers(const Spectrum& spectrum);
@@ -56,7 +55,7 @@ class BinaryDumper : public ElementVisitor {
   void Write(const std::vector<float>& values);
   void Put(const char* bytes, std::size_t count);
 
-  std::set<std::string> condition_ids_;
+  ConditionTable conditions_;
   std::ostream& out_;
 };
 

@@ -1,11 +1,11 @@
 #include "aldermoor/vexdoc/internals/conditionmanager.h"
 
 #include <algorithm>
-#include <functional>
 #include <utility>
 
 #include "aldermoor/utilities/exceptions/exceptions.h"
 #include "aldermoor/utilities/exceptions/frame.h"
+#include "aldermoor/vexdoc/internals/conditionhash.h"
 #include "aldermoor/vexdoc/spectrum.h"
 
 namespace Aldermoor::Vexdoc::Internals {
@@ -17,16 +17,6 @@ namespace {
 
 // A walk over fewer blocks costs less than a hash of the attributes.
 constexpr std::size_t kFewBlocks = 16;
-
-template <class Attributes>
-std::size_t HashOf(const Attributes& attributes) {
-  std::size_t hash = 0;
-  for (const auto& [key, value] : attributes) {
-    const std::hash<std::string_view> text;
-    hash = (hash * 31 + text(key)) * 31 + text(value);
-  }
-  return hash;
-}
 
 }  // namespace
 

@@ -18,7 +18,7 @@ namespace Aldermoor::Vexdoc::Internals {
 /// The owner of the condition blocks that sample attributes share.
 ///
 /// Attributes of different documents share a block too, if their conditions are equal.  IDs count
-/// up from "1" and are never given out again.  Nothing in the library removes a block.
+/// up from "1" and are never given out again.  Nothing in the library removes a block by itself.
 /// Shared state: this one object, for the whole process and without a lock.
 class ConditionManager final : public Utilities::Patterns::Singleton<ConditionManager> {
  public:
@@ -35,6 +35,7 @@ class ConditionManager final : public Utilities::Patterns::Singleton<ConditionMa
   Block FindConditions(std::span<const std::pair<std::string_view, std::string>> attributes);
   /// Throws: ResourceNotAvailableException if there is no block of that ID.
   virtual Block GetConditions(const std::string& id);
+  bool HasConditions(const std::string& id) const { return conditions_.contains(id); }
   /// Stores an empty block under the next ID.
   virtual Block NewConditions();
   /// No effect if there is no such block; attributes that hold it go on using it.

@@ -54,4 +54,19 @@ std::string NumberFault(std::string_view text) {
                                                  : "";
 }
 
+std::string PlaceText(const std::string& set, const std::string& sample,
+                      const std::string& attribute) {
+  std::string text;
+  if (!set.empty() || !sample.empty() || !attribute.empty()) {
+    text += "set '" + set + "'";
+  }
+  if (!sample.empty() || !attribute.empty()) {
+    text += ", sample '" + sample + "'";
+  }
+  if (!attribute.empty()) {
+    text += ", " + attribute;
+  }
+  return text.empty() ? text : text + ": ";
+}
+
 }  // namespace Aldermoor::Vexdoc::Internals

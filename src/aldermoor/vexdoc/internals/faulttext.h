@@ -21,6 +21,10 @@ std::string NumberText(float value);
 /// does.
 std::string NumberFault(std::string_view text);
 
+/// "set 'x', sample 'y', Spectrum 1: ", as far as it goes; empty for the document itself.
+std::string PlaceText(const std::string& set, const std::string& sample,
+                      const std::string& attribute);
+
 }  // namespace Aldermoor::Vexdoc::Internals
 
 #endif  // ALDERMOOR_VEXDOC_INTERNALS_FAULTTEXT_H

@@ -44,16 +44,13 @@ constexpr const char* kInternalFailure =
 constexpr const char* kLoadingFailure =
     "An internal XML exception has occurred while loading XML:\n'%REASON%'";
 
-[[noreturn]] void FailInternally(const char* pattern, const XMLCh* reason) {
-  throw VexException(Filled(pattern, "%REASON%", ToNativeString(reason)),
+[[noreturn]] void FailInternally(const char* pattern, const std::string& reason) {
+  throw VexException(Filled(pattern, "%REASON%", reason),
                      ALDERMOOR_HERE(Aldermoor::Vexdoc::Internals::XercesAdapter));
 }
 
-void CheckPlatform() {
-  if (XMLPlatformUtils::fgMemoryManager == nullptr) {
-    throw VexException("The XML platform is not initialised",
-                       ALDERMOOR_HERE(Aldermoor::Vexdoc::Internals::XercesAdapter));
-  }
+[[noreturn]] void FailInternally(const char* pattern, const XMLCh* reason) {
+  FailInternally(pattern, ToNativeString(reason));
 }
 
 std::string StreamFailure(const VexException& e) {
@@ -80,7 +77,7 @@ std::vector<char> ReadAll(std::istream& in) {
 XercesAdapter::XercesAdapter(VEX* document) : document_(document) {}
 
 void XercesAdapter::Load(std::istream& in) try {
-  CheckPlatform();
+  RequireXMLPlatform();
   try {
     LoadFrom(ReadAll(in), kStreamName);
   } catch (const XMLException& e) {
@@ -99,7 +96,7 @@ void XercesAdapter::Load(std::istream& in) try {
 ALDERMOOR_FRAME(Aldermoor::Vexdoc::Internals::XercesAdapter::Load)
 
 void XercesAdapter::Load(File& file) try {
-  CheckPlatform();
+  RequireXMLPlatform();
   const std::string path = file.GetAbsolutePlatformName();
   if (!file.IsAccessable(false)) {
     throw ResourceNotAvailableException(
@@ -119,7 +116,7 @@ void XercesAdapter::Load(File& file) try {
 ALDERMOOR_FRAME(Aldermoor::Vexdoc::Internals::XercesAdapter::Load)
 
 void XercesAdapter::Store(std::ostream& out) try {
-  CheckPlatform();
+  RequireXMLPlatform();
   try {
     const DocumentWriter writer;
     XMLComposer composer(writer.GetDocument());
@@ -132,6 +129,8 @@ void XercesAdapter::Store(std::ostream& out) try {
     FailInternally(kInternalFailure, e.getMessage());
   } catch (const xercesc::OutOfMemoryException&) {
     throw std::bad_alloc();
+  } catch (const XMLFailure& e) {
+    FailInternally(kInternalFailure, e.what());
   } catch (const VexException& e) {
     throw VexException(
         Filled("An error occurred during composing a VEXStream:\n%REASON%", "%REASON%", e.what()),

@@ -11,7 +11,6 @@
 #include <xercesc/util/XMLString.hpp>
 
 #include "aldermoor/utilities/tools/lexicalcast.h"
-#include "aldermoor/vexdoc/vexexception.h"
 
 namespace Aldermoor::Vexdoc::Internals {
 
@@ -28,11 +27,23 @@ bool IsDigit(XMLCh c) {
   return c >= u'0' && c <= u'9';
 }
 
+// Halves of pairs too: the transcoder makes whole ones.
+bool IsXMLCharacter(XMLCh c) {
+  return (c >= u' ' && c < 0xFFFE) || c == u'\t' || c == u'\n' || c == u'\r';
+}
+
 bool IsPartOfNumber(XMLCh c) {
   return IsDigit(c) || c == u'.' || c == u'-' || c == u'+' || c == u'e' || c == u'E';
 }
 
 }  // namespace
+
+void RequireXMLPlatform() {
+  if (XMLPlatformUtils::fgMemoryManager == nullptr) {
+    throw VexException("The XML platform is not initialised",
+                       ALDERMOOR_HERE(Aldermoor::Vexdoc::Internals::RequireXMLPlatform));
+  }
+}
 
 XMLChBuffer::XMLChBuffer(const char* text)
     : text_(XMLString::transcode(text, XMLPlatformUtils::fgMemoryManager)) {}
@@ -50,10 +61,10 @@ NativeBuffer::~NativeBuffer() {
 
 const XMLCh* XMLChText::Set(const std::string& text) {
   // Nearly all text is ASCII, which is the same in both; the rest goes through the transcoder.
-  const auto is_ascii = [](char c) {
-    return c > 0;
+  const auto is_plain = [](char c) {
+    return c >= ' ' || c == '\n' || c == '\t' || c == '\r';
   };
-  if (std::all_of(text.begin(), text.end(), is_ascii)) {
+  if (std::all_of(text.begin(), text.end(), is_plain)) {
     return SetAscii(text.data(), text.data() + text.size());
   }
   text_ = XMLChBuffer(text).Get();
@@ -61,6 +72,11 @@ const XMLCh* XMLChText::Set(const std::string& text) {
   if (ToNativeString(text_.c_str()) != text) {
     throw VexException("XML cannot carry the text '" + text + "'",
                        ALDERMOOR_HERE(Aldermoor::Vexdoc::Internals::XMLChText::Set));
+  }
+  // Not left to the serialiser, which does not know whose text it is.
+  if (!std::all_of(text_.begin(), text_.end(), IsXMLCharacter)) {
+    throw XMLFailure("XML has no such character: '" + text + "'",
+                     ALDERMOOR_HERE(Aldermoor::Vexdoc::Internals::XMLChText::Set));
   }
   return text_.c_str();
 }

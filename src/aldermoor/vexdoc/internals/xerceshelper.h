@@ -5,7 +5,18 @@
 
 #include <xercesc/util/XercesDefs.hpp>
 
+#include "aldermoor/vexdoc/vexexception.h"
+
 namespace Aldermoor::Vexdoc::Internals {
+
+/// Throws: VexException if the application has not initialised the XML platform.
+void RequireXMLPlatform();
+
+/// What the XML library refuses.
+class XMLFailure : public VexException {
+ public:
+  using VexException::VexException;
+};
 
 /// A string in the parser's characters, made from one of the model's and freed with this object.
 class XMLChBuffer {
@@ -40,7 +51,8 @@ class NativeBuffer {
 class XMLChText {
  public:
   /// The three forms give a pointer that is good until the next call.
-  /// Throws: VexException if `text` holds a zero byte or is not in the local code page.
+  /// Throws: VexException if `text` holds a zero byte or is not in the local code page; XMLFailure
+  /// if it holds a character that XML does not have.
   const XMLCh* Set(const std::string& text);
   /// Six significant digits, as a stream writes them.
   const XMLCh* Set(float value);

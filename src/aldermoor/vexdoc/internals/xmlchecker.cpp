@@ -11,7 +11,6 @@
 #include <xercesc/dom/DOMNamedNodeMap.hpp>
 #include <xercesc/framework/MemBufInputSource.hpp>
 #include <xercesc/util/OutOfMemoryException.hpp>
-#include <xercesc/util/PlatformUtils.hpp>
 #include <xercesc/util/XMLException.hpp>
 #include <xercesc/util/XMLString.hpp>
 
@@ -26,7 +25,6 @@
 namespace Aldermoor::Vexdoc::Internals {
 
 using xercesc::DOMNode;
-using xercesc::XMLPlatformUtils;
 using xercesc::XMLString;
 
 namespace {
@@ -58,10 +56,7 @@ bool IsBlank(const XMLCh* text) {
 }  // namespace
 
 std::vector<Fault> XMLChecker::Check(std::string_view bytes) try {
-  if (XMLPlatformUtils::fgMemoryManager == nullptr) {
-    throw VexException("The XML platform is not initialised",
-                       ALDERMOOR_HERE(Aldermoor::Vexdoc::Internals::XMLChecker::Check));
-  }
+  RequireXMLPlatform();
   try {
     CheckText(bytes);
   } catch (const VexXMLParseException& e) {

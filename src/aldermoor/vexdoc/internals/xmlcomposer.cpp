@@ -4,11 +4,15 @@
 #include <cstdint>
 #include <iterator>
 
+#include <xercesc/dom/DOMException.hpp>
+
 #include "aldermoor/utilities/exceptions/frame.h"
+#include "aldermoor/utilities/exceptions/traceableexception.h"
 #include "aldermoor/utilities/tools/lexicalcast.h"
 #include "aldermoor/vexdoc/colorvector.h"
 #include "aldermoor/vexdoc/conditionkeys.h"
-#include "aldermoor/vexdoc/internals/conditionmanager.h"
+#include "aldermoor/vexdoc/internals/attributerules.h"
+#include "aldermoor/vexdoc/internals/faulttext.h"
 #include "aldermoor/vexdoc/internals/xmlnames.h"
 #include "aldermoor/vexdoc/recipe.h"
 #include "aldermoor/vexdoc/spectrum.h"
@@ -16,6 +20,7 @@
 
 namespace Aldermoor::Vexdoc::Internals {
 
+using Utilities::Exceptions::TraceableException;
 using Utilities::Tools::lexical_cast;
 using xercesc::DOMElement;
 
@@ -28,31 +33,35 @@ bool IsStandardKey(const std::string& key) {
                      [&key](const XMLNames::HeaderKey& standard) { return key == standard.key; });
 }
 
-// Wavelengths in nm; of "380nm" the number counts.
-std::int16_t Wavelength(const Conditions& conditions, const char* key, const char* fallback) {
-  return lexical_cast<std::int16_t>(conditions.GetAttribute(key, fallback));
-}
-
 }  // namespace
 
 XMLComposer::XMLComposer(xercesc::DOMDocument& document) : document_(document) {}
 
 void XMLComposer::VisitVex(VEX& vex) try {
-  condition_ids_.clear();
-  DOMElement* const root = VexNodeComposer(vex, XMLNames::kVex);
-  root->setAttribute(XMLNames::kVersion, u"1.0");
-  ConditionsComposer(root);
-  current_ = root;
+  try {
+    DOMElement* const root = VexNodeComposer(vex, XMLNames::kVex);
+    root->setAttribute(XMLNames::kVersion, u"1.0");
+    ConditionsComposer(root);
+    current_ = root;
+  } catch (TraceableException& e) {
+    e.prepend(PlaceText(place_.set == nullptr ? "" : place_.set->GetName(),
+                        place_.sample == nullptr ? "" : place_.sample->GetName(), ""));
+    throw;
+  }
 }
 ALDERMOOR_FRAME(Aldermoor::Vexdoc::Internals::XMLComposer::VisitVex)
 
 void XMLComposer::VisitSampleSet(SampleSet& set) try {
+  place_.set = &set;
   current_ = VexNodeComposer(set, XMLNames::kSampleSet);
+  place_.set = nullptr;
 }
 ALDERMOOR_FRAME(Aldermoor::Vexdoc::Internals::XMLComposer::VisitSampleSet)
 
 void XMLComposer::VisitSample(Sample& sample) try {
+  place_.sample = &sample;
   current_ = VexNodeComposer(sample, XMLNames::kSample);
+  place_.sample = nullptr;
 }
 ALDERMOOR_FRAME(Aldermoor::Vexdoc::Internals::XMLComposer::VisitSample)
 
@@ -76,10 +85,8 @@ void XMLComposer::VisitUnknownSampleAttribute(UnknownSampleAttribute& attribute)
   DOMElement* const element = NewNode(name_.Set(data->GetName()));
   VEXDataTreeComposer(element, *data);
   if (!attribute.GetConditions().IsNull()) {
-    const std::string id = attribute.GetConditions()->GetID();
     // The tree still holds the link of the file that it came from.
-    element->setAttribute(XMLNames::kConditions, text_.Set(id));
-    condition_ids_.insert(id);
+    Link(element, *attribute.GetConditions());
   }
   current_ = Wrap(element);
 }
@@ -106,12 +113,18 @@ DOMElement* XMLComposer::SampleAttributeComposer(Attribute& attribute, const XML
     return nullptr;
   }
   DOMElement* const element = NewNode(name);
-  const std::string id = attribute.GetConditions()->GetID();
-  element->setAttribute(XMLNames::kConditions, text_.Set(id));
-  condition_ids_.insert(id);
+  Link(element, *attribute.GetConditions());
   HeaderComposer(element, attribute, true);
   ComposeMembers(attribute, element);
   return Wrap(element);
+}
+
+void XMLComposer::Link(DOMElement* element, const Conditions& block) {
+  const std::string& id = conditions_.GetId(block);
+  if (conditions_.GetBlocks().size() > users_.size()) {
+    users_.emplace(id, place_);
+  }
+  element->setAttribute(XMLNames::kConditions, text_.Set(id));
 }
 
 DOMElement* XMLComposer::Wrap(DOMElement* element) {
@@ -155,16 +168,13 @@ void XMLComposer::SpectrumVectorComposer(DOMElement* element, const Conditions& 
   if (data.empty()) {
     return;
   }
-  const std::int16_t minimum = Wavelength(conditions, ConditionKeys::kWavelengthMin, "380");
-  const std::int16_t maximum = Wavelength(conditions, ConditionKeys::kWavelengthMax, "730");
-  const auto intervals = static_cast<std::int64_t>(data.size()) - 1;
-  const std::int64_t step = intervals == 0 ? 0 : (maximum - minimum) / intervals;
-  std::int64_t wavelength = minimum;
+  const WavelengthSteps steps(conditions, data.size());
+  std::int64_t wavelength = steps.first;
   for (const float value : data) {
     DOMElement* const node = NewNode(XMLNames::kValue, text_.Set(value));
     node->setAttribute(XMLNames::kName, name_.Set(static_cast<unsigned int>(wavelength)));
     element->appendChild(node);
-    wavelength += step;
+    wavelength += steps.step;
   }
 }
 
@@ -196,7 +206,7 @@ void XMLComposer::VEXDataTreeComposer(DOMElement* element, const DataTree& tree)
     element->appendChild(document_.createTextNode(text_.Set(tree.GetValue())));
   }
   for (const auto& [name, value] : tree.GetAttributes()) {
-    element->setAttribute(name_.Set(name), text_.Set(value));
+    SetAttribute(element, name, value);
   }
   has_mixed_content_ = has_mixed_content_ || (tree.HasChildren() && !tree.GetValue().empty());
   for (const auto& child : tree.GetChildren()) {
@@ -208,10 +218,10 @@ void XMLComposer::VEXDataTreeComposer(DOMElement* element, const DataTree& tree)
 ALDERMOOR_FRAME(Aldermoor::Vexdoc::Internals::XMLComposer::VEXDataTreeComposer)
 
 void XMLComposer::ConditionsComposer(DOMElement* parent) {
-  for (const std::string& id : condition_ids_) {
-    const ConditionManager::Block block = ConditionManager::GetInstance().GetConditions(id);
+  for (const auto& [id, block] : conditions_.GetBlocks()) {
+    place_ = users_.at(id);
     DOMElement* const element = NewNode(XMLNames::kConditions);
-    AppendNode(element, XMLNames::kId, block->GetID());
+    AppendNode(element, XMLNames::kId, id);
     for (const auto& [key, value] : block->GetAttributes()) {
       AppendNamed(element, XMLNames::kAttribute, key, text_.Set(value));
     }
@@ -225,8 +235,18 @@ void XMLComposer::ConditionsComposer(DOMElement* parent) {
   }
 }
 
-DOMElement* XMLComposer::NewNode(const XMLCh* name) {
+// What the frames on the way would make of a foreign exception says nothing.
+void XMLComposer::SetAttribute(DOMElement* element, const std::string& name,
+                               const std::string& value) try {
+  element->setAttribute(name_.Set(name), text_.Set(value));
+} catch (const xercesc::DOMException& e) {
+  throw XMLFailure(ToNativeString(e.getMessage()), "");
+}
+
+DOMElement* XMLComposer::NewNode(const XMLCh* name) try {
   return document_.createElement(name);
+} catch (const xercesc::DOMException& e) {
+  throw XMLFailure(ToNativeString(e.getMessage()), "");
 }
 
 DOMElement* XMLComposer::NewNode(const XMLCh* name, const XMLCh* text) {

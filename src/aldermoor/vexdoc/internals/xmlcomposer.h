@@ -1,7 +1,7 @@
 #ifndef ALDERMOOR_VEXDOC_INTERNALS_XMLCOMPOSER_H
 #define ALDERMOOR_VEXDOC_INTERNALS_XMLCOMPOSER_H
 
-#include <set>
+#include <map>
 #include <string>
 #include <vector>
 
@@ -11,6 +11,7 @@
 
 #include "aldermoor/vexdoc/dataitem.h"
 #include "aldermoor/vexdoc/elementvisitor.h"
+#include "aldermoor/vexdoc/internals/conditiontable.h"
 #include "aldermoor/vexdoc/internals/xerceshelper.h"
 #include "aldermoor/vexdoc/vex.h"
 
@@ -18,12 +19,12 @@ namespace Aldermoor::Vexdoc::Internals {
 
 /// Builds the DOM of a document in the current dialect.
 ///
-/// The Visit operation of an element's class leaves the DOM element in the current node.  Derived
-/// attributes are left out.  The condition blocks of those that are written come last, each once,
-/// in the order of the IDs' texts.
-/// Throws: VexException for text that XML cannot carry; DOMException for names that are none;
+/// Serves one document.  The Visit operation of an element's class leaves the DOM element in the
+/// current node.  Derived attributes are left out.  The condition blocks of those that are written
+/// come last, each once, in the order of the IDs' texts. Throws: VexException for text that is not
+/// in the code page; XMLFailure for characters that XML does not have and names that are none;
 /// InvalidArgumentException for wavelengths that are no numbers; NullPointerException for an
-/// attribute without conditions.
+/// attribute without conditions.  VisitVex puts the set and the sample in front of the message.
 class XMLComposer : public ElementVisitor {
  public:
   /// `document` makes all nodes and is kept by reference.
@@ -53,6 +54,7 @@ class XMLComposer : public ElementVisitor {
   xercesc::DOMElement* VexNodeComposer(Node& node, const XMLCh* name);
   template <class Attribute>
   xercesc::DOMElement* SampleAttributeComposer(Attribute& attribute, const XMLCh* name);
+  void Link(xercesc::DOMElement* element, const Conditions& block);
   xercesc::DOMElement* Wrap(xercesc::DOMElement* element);
 
   void HeaderComposer(xercesc::DOMElement* element, const Header& header, bool isSampleAttribute);
@@ -60,6 +62,8 @@ class XMLComposer : public ElementVisitor {
                               const std::vector<float>& data);
   void ConditionsComposer(xercesc::DOMElement* parent);
 
+  void SetAttribute(xercesc::DOMElement* element, const std::string& name,
+                    const std::string& value);
   xercesc::DOMElement* NewNode(const XMLCh* name);
   xercesc::DOMElement* NewNode(const XMLCh* name, const XMLCh* text);
   void AppendNode(xercesc::DOMElement* parent, const XMLCh* name, const std::string& text);
@@ -69,7 +73,15 @@ class XMLComposer : public ElementVisitor {
 
   xercesc::DOMDocument& document_;
   xercesc::DOMNode* current_ = nullptr;
-  std::set<std::string> condition_ids_;
+  // In whose content the composer is; what a failure names.
+  struct Place {
+    const Header* set = nullptr;
+    const Header* sample = nullptr;
+  };
+
+  ConditionTable conditions_;
+  std::map<std::string, Place> users_;  // of the blocks, the first of each
+  Place place_;
   bool has_mixed_content_ = false;
   // Scratch space.
   XMLChText name_;
