@@ -12,6 +12,7 @@
 #include "aldermoor/vexdoc/colorvector.h"
 #include "aldermoor/vexdoc/recipe.h"
 #include "aldermoor/vexdoc/spectrum.h"
+#include "aldermoor/vexdoc/vex.h"
 
 #include "tests/faults/interposition.h"
 
@@ -72,6 +73,10 @@ std::string TextOf(const ColorVector& vector) {
          std::to_string(vector.GetDatastore()[0].second);
 }
 
+std::string TextOf(const SampleIterator& walk) {
+  return walk.Dereference()->GetName();
+}
+
 template <class T>
 void CheckCopies(const char* name, const T& source, const T& other) {
   int failures = 0;
@@ -109,6 +114,13 @@ TEST(CopiesTest, AreTracedAndWholeOrNotMade) {
               ColorScheme({{"k", 3.0F}}));
   CheckCopies("ColorSpace", ColorSpace("CIELab", {1.0F, 2.0F, 3.0F}),
               ColorSpace("RGB", {4.0F, 5.0F, 6.0F}));
+  VEX document;
+  document.AddSample("set", Sample("first"));
+  Sample second("second");
+  second.AddElement(color);
+  document.AddSample("set", second);
+  CheckCopies("SampleIterator", document.GetFirstSample(all, "VEXColorVector", "set"),
+              document.GetFirstSample(""));
 }
 
 }  // namespace

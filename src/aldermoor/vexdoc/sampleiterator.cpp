@@ -29,8 +29,25 @@ SampleIterator::SampleIterator(const SampleSets& sets, const Conditions& filter,
 }
 ALDERMOOR_FRAME(Aldermoor::Vexdoc::SampleIterator::SampleIterator)
 
-SampleIterator::SampleIterator(const SampleIterator&) = default;
-SampleIterator& SampleIterator::operator=(const SampleIterator&) = default;
+SampleIterator::SampleIterator(const SampleIterator& other) try
+    : SampleIteratorDeprecated(other),
+      sets_(other.sets_),
+      place_(other.place_),
+      is_confined_(other.is_confined_),
+      type_(other.type_),
+      filter_(other.filter_) {}
+ALDERMOOR_FRAME(Aldermoor::Vexdoc::SampleIterator::SampleIterator)
+
+SampleIterator& SampleIterator::operator=(const SampleIterator& other) try {
+  std::string type(other.type_);  // first, for memory may be short
+  filter_ = other.filter_;
+  type_.swap(type);
+  sets_ = other.sets_;
+  place_ = other.place_;
+  is_confined_ = other.is_confined_;
+  return *this;
+}
+ALDERMOOR_FRAME(Aldermoor::Vexdoc::SampleIterator::operator=)
 
 bool SampleIterator::HasNext() const {
   return place_.samples != nullptr && place_.sample != place_.samples->end();
