@@ -6,6 +6,7 @@
 #include "aldermoor/vexdoc/colorvector.h"
 #include "aldermoor/vexdoc/conditionkeys.h"
 #include "aldermoor/vexdoc/internals/conditionmanager.h"
+#include "aldermoor/vexdoc/internals/wavelengths.h"
 #include "aldermoor/vexdoc/mandatoryconditions.h"
 #include "aldermoor/vexdoc/spectrum.h"
 
@@ -18,12 +19,20 @@ constexpr std::string_view kCustomCondition = "CustomCondition";
 using Texts = std::map<std::string, std::string>;
 using Counts = std::map<std::string, std::size_t>;
 
+// Legacy documents may say "Undefined" for a wavelength that they do not know.
+bool Names(const Conditions& conditions, const std::string& key) {
+  const bool is_wavelength =
+      key == ConditionKeys::kWavelengthMin || key == ConditionKeys::kWavelengthMax;
+  return conditions.HasAttribute(key) &&
+         (!is_wavelength || Internals::ReadWavelength(conditions.GetAttribute(key)));
+}
+
 // Returns those of the mandatory `keys` that are missing in the end.
 std::vector<std::string> Fill(Conditions& conditions, const std::vector<std::string>& keys,
                               const Texts& given, std::vector<std::string>& taken) {
   std::vector<std::string> missing;
   for (const std::string& key : keys) {
-    if (conditions.HasAttribute(key)) {
+    if (Names(conditions, key)) {
       continue;
     }
     if (const auto found = given.find(key); found != given.end()) {
@@ -53,8 +62,7 @@ class Completer {
       for (const auto& [sample_key, sample] : set->GetSamples()) {
         for (const auto& [key, attribute] : sample->GetElements()) {
           CompletionReport::Missing missing = Complete(*attribute);
-          if (missing.keys.empty() ||
-              ++report_.missing_count > CompletionReport::kMostListed) {
+          if (missing.keys.empty() || ++report_.missing_count > CompletionReport::kMostListed) {
             continue;
           }
           missing.set = set->GetName();

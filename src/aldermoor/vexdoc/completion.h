@@ -20,7 +20,8 @@ namespace Aldermoor::Vexdoc {
 ALDERMOOR_EXPORT bool IsConditionOfSpectra(std::string_view key);
 ALDERMOOR_EXPORT bool IsConditionOfColors(std::string_view key);
 
-/// Conditions, key to value, for what lacks them.  What a file does name is never replaced.
+/// Conditions, key to value, for what lacks them.  What a file does name is never replaced, but a
+/// wavelength that is no number counts as lacking.
 struct Completion {
   std::map<std::string, std::string> spectra;
   std::map<std::string, std::string> colors;

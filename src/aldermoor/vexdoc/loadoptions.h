@@ -63,6 +63,12 @@ struct LoadReport {
   /// Ranges such as "31 from 400nm to 700nm" and how many spectra took them from their points.
   std::map<std::string, std::size_t> ranges_taken;
   CompletionReport completion;
+
+  /// Whether the document holds conditions that its file does not.
+  bool HasCompleted() const {
+    return !ranges_taken.empty() || !completion.counted.empty() || !completion.spectra.empty() ||
+           !completion.colors.empty();
+  }
 };
 
 }  // namespace Aldermoor::Vexdoc

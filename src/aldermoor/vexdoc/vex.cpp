@@ -179,8 +179,8 @@ LoadReport VEX::LoadXML(const File& file, const LoadOptions& options) try {
   Internals::XercesAdapter adapter(this);
   adapter.SetOptions(options, report);
   LoadFromText(adapter, file);
-  // A cache is read by plain loads too, which complete nothing.
-  if (options.cache == CacheUse::kReadAndWrite && adapter.WasExact()) {
+  // A cache answers for the file, not for what was added to its document.
+  if (options.cache == CacheUse::kReadAndWrite && adapter.WasExact() && !report.HasCompleted()) {
     UpdateCacheQuietly(*this, cache, file, stamp);
   }
   return report;

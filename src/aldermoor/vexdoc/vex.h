@@ -67,9 +67,9 @@ class ALDERMOOR_EXPORT VEX
   void LoadXML(const Utilities::FileSystem::File& file, bool updateCache);
   /// The same two, but with nothing in the document that the text does not say: elements for which
   /// it has no dates have none, and spectra whose wavelengths are not those of their conditions are
-  /// refused, completed or told as `options` ask (loadoptions.h).  On failure, the document stays as
-  /// it was with both.
-  /// Throws: WavelengthException with sets, samples and wavelengths; what the plain ones throw.
+  /// refused, completed or told as `options` ask (loadoptions.h).  On failure, the document stays
+  /// as it was with both. Throws: WavelengthException with sets, samples and wavelengths; what the
+  /// plain ones throw.
   LoadReport Load(std::istream& in, const LoadOptions& options);
   LoadReport LoadXML(const Utilities::FileSystem::File& file, const LoadOptions& options);
   /// Writes this document to `file` as Store does, and with `updateCache` to its cache.

@@ -30,8 +30,8 @@ class Agreement {
 };
 
 bool NamesRange(const Conditions& conditions) {
-  return conditions.HasAttribute(ConditionKeys::kWavelengthMin) &&
-         conditions.HasAttribute(ConditionKeys::kWavelengthMax);
+  return ReadWavelength(conditions.GetAttribute(ConditionKeys::kWavelengthMin, "")) &&
+         ReadWavelength(conditions.GetAttribute(ConditionKeys::kWavelengthMax, ""));
 }
 
 bool NamesCount(const Conditions& conditions, std::size_t count) {
@@ -52,8 +52,7 @@ std::string RangeText(const Wavelengths& points) {
   if (report.contradiction_count > kMostInText) {
     text += "\nand " + std::to_string(report.contradiction_count - kMostInText) + " more";
   }
-  throw WavelengthException(text,
-                            ALDERMOOR_HERE(Aldermoor::Vexdoc::Internals::LoadNotes::Settle));
+  throw WavelengthException(text, ALDERMOOR_HERE(Aldermoor::Vexdoc::Internals::LoadNotes::Settle));
 }
 
 }  // namespace
@@ -67,9 +66,7 @@ void LoadNotes::AddSpectrum(const Spectrum& spectrum, Wavelengths points) {
 
 void LoadNotes::AddIllumination(const std::string& id, const Wavelengths& points,
                                 const Conditions& conditions) {
-  // An illuminant is read as 380 to 730 nm, but written with the wavelengths of its block.
-  if (!AreOfConditions(points, CustomIlluminationConditions()) &&
-      !AreOfConditions(points, conditions)) {
+  if (!AreOfIllumination(points, conditions)) {
     illuminations_.push_back({"", "",
                               "the illuminant of the conditions " + Quoted(id) + ": " +
                                   ContradictionText(points, CustomIlluminationConditions())});
@@ -122,8 +119,8 @@ void LoadNotes::TakeRanges(const VEX& document, LoadReport& report) const {
   ForEachSpectrum(document, [&](const auto&, const auto&, SampleAttribute& spectrum,
                                 const Wavelengths& points) {
     const Conditions& told = *spectrum.GetConditions();
-    if (!AreRegular(points) || (NamesRange(told) && NamesCount(told, points.size()) &&
-                                agreement.Of(points, told))) {
+    if (!AreRegular(points) ||
+        (NamesRange(told) && NamesCount(told, points.size()) && agreement.Of(points, told))) {
       return;
     }
     Conditions conditions(told);

@@ -6,6 +6,7 @@
 
 #include "aldermoor/utilities/tools/lexicalcast.h"
 #include "aldermoor/vexdoc/conditionkeys.h"
+#include "aldermoor/vexdoc/internals/customillumination.h"
 #include "aldermoor/vexdoc/internals/faulttext.h"
 
 namespace Aldermoor::Vexdoc::Internals {
@@ -69,6 +70,11 @@ bool AreOfConditions(const Wavelengths& points, const Conditions& conditions) {
     expected += step;
     return is_it;
   });
+}
+
+bool AreOfIllumination(const Wavelengths& points, const Conditions& conditions) {
+  return AreOfConditions(points, CustomIlluminationConditions()) ||
+         AreOfConditions(points, conditions);
 }
 
 bool AreRegular(const Wavelengths& points) {

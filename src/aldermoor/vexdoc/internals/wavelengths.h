@@ -26,6 +26,10 @@ bool IsWavelengthMisread(const std::string& text);
 /// the minimum on in whole steps.  Without a readable range, it is 380 to 730 nm.
 bool AreOfConditions(const Wavelengths& points, const Conditions& conditions);
 
+/// Whether `points` are those at which the illuminant of a block with `conditions` may stand: it is
+/// read as 380 to 730 nm, but written with the wavelengths of the block.
+bool AreOfIllumination(const Wavelengths& points, const Conditions& conditions);
+
 /// Whether `points` have one step, so that their first, last and number say all of them.
 bool AreRegular(const Wavelengths& points);
 

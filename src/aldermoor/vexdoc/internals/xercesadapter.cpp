@@ -194,10 +194,10 @@ void XercesAdapter::LoadFrom(const std::vector<char>& bytes, const std::string& 
                       .takes_any_count = options_->wavelengths == WavelengthUse::kComplete});
   }
   const SmartPointer<VEX> loaded = loader->Load();
+  was_exact_ = loader->GetNotes().IsExact(*loaded);
   if (options_ != nullptr) {
     loader->GetNotes().Settle(*loaded, *options_, *report_);
   }
-  was_exact_ = loader->GetNotes().IsExact(*loaded);
   DocumentAccess::Swap(*document_, *loaded);
 }
 

@@ -44,7 +44,8 @@ class XercesAdapter : public XMLParserAdapter {
   /// Makes loads follow `options` and fill `report`; both outlive this object.  They throw
   /// WavelengthException then, and give no dates that the text does not hold.
   void SetOptions(const LoadOptions& options, LoadReport& report);
-  /// Whether the document of the last load says what its text says; see LoadNotes.
+  /// Whether the document of the last load said what its text says, before it was completed; see
+  /// LoadNotes.
   bool WasExact() const { return was_exact_; }
 
   /// The loader for the dialect of a parsed document, which its root's "Version" tells.
