@@ -37,6 +37,7 @@ from aldermoor._errors import (
     MissingFileError,
     NotFoundError,
     ParseError,
+    WavelengthError,
 )
 from aldermoor._results import ColorRendering, Item, SampleRows
 from aldermoor._words import (
@@ -72,6 +73,7 @@ __all__ = [
     "SampleRows",
     "SampleSet",
     "Spectrum",
+    "WavelengthError",
     "__version__",
     "channels",
     "color_rendering",

@@ -30,6 +30,14 @@ class ParseError(Error, ValueError):
     column: int | None = None
 
 
+class WavelengthError(ParseError):
+    """The wavelengths of spectra in a file are not those of their conditions.
+
+    The text names set, sample, points and conditions.  `load(..., wavelengths="complete")` takes
+    the range from points with one step, `wavelengths="as told"` that of the conditions.
+    """
+
+
 class NotFoundError(Error, LookupError):
     """There is no such set, sample or attribute, and nothing that could give it."""
 

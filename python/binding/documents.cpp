@@ -16,6 +16,8 @@
 
 #include "aldermoor/utilities/exceptions/exceptions.h"
 #include "aldermoor/vexdoc/colorvector.h"
+#include "aldermoor/vexdoc/completion.h"
+#include "aldermoor/vexdoc/loadoptions.h"
 #include "aldermoor/vexdoc/spectrum.h"
 #include "aldermoor/vexdoc/vex.h"
 #include "aldermoor/vexdoc/vexexception.h"
@@ -37,6 +39,8 @@ using Utilities::Tools::SmartPointer;
 using Vexdoc::Sample;
 using Vexdoc::SampleSet;
 using Vexdoc::VEX;
+
+using Texts = std::map<std::string, std::string>;
 
 // ---- files
 
@@ -81,13 +85,96 @@ int ErrorOfWriting(std::string_view text) {
   return 0;
 }
 
-Owner<VEX> Load(const py::object& given, bool cache) {
+Vexdoc::WavelengthUse WavelengthsOf(const std::string& word) {
+  CheckWord("wavelengths", word, "WAVELENGTHS");
+  return word == "complete"  ? Vexdoc::WavelengthUse::kComplete
+         : word == "as told" ? Vexdoc::WavelengthUse::kReport
+                             : Vexdoc::WavelengthUse::kRefuse;
+}
+
+// Keys go by their kind, or by "Spectrum." or "Color." in front of any other one.
+Vexdoc::Completion CompletionOf(const Texts& texts) {
+  constexpr std::string_view kSpectrum = "Spectrum.";
+  constexpr std::string_view kColor = "Color.";
+  Vexdoc::Completion completion;
+  for (const auto& [key, value] : texts) {
+    if (key.starts_with(kSpectrum)) {
+      completion.spectra.emplace(key.substr(kSpectrum.size()), value);
+    } else if (key.starts_with(kColor)) {
+      completion.colors.emplace(key.substr(kColor.size()), value);
+    } else if (!Vexdoc::IsConditionOfSpectra(key) && !Vexdoc::IsConditionOfColors(key)) {
+      throw py::value_error("complete: '" + key +
+                            "' is a condition of neither kind; write "
+                            "Spectrum.KEY or Color.KEY");
+    }
+    if (Vexdoc::IsConditionOfSpectra(key)) {
+      completion.spectra.emplace(key, value);
+    }
+    if (Vexdoc::IsConditionOfColors(key)) {
+      completion.colors.emplace(key, value);
+    }
+  }
+  return completion;
+}
+
+// Checks the words that the library would take whatever they are, and puts daylights in its form.
+void CheckWords(Vexdoc::Completion& completion) {
+  constexpr const char* kIllumination = "Colorimetric.Illumination";
+  const auto of = [](Texts& texts, const char* key) {
+    const auto found = texts.find(key);
+    return found == texts.end() ? nullptr : &found->second;
+  };
+  if (std::string* const word = of(completion.colors, kIllumination)) {
+    *word = MakeConditions({py::str(*word), "TwoDegree"}).GetAttribute(kIllumination);
+  }
+  if (const std::string* const word = of(completion.colors, "Colorimetric.Observer")) {
+    CheckWord("complete", *word, "OBSERVERS");
+  }
+  if (const std::string* const word = of(completion.spectra, "Physical.SpectrumType")) {
+    CheckWord("complete", *word, "SPECTRUM_TYPES");
+  }
+}
+
+Vexdoc::LoadOptions OptionsOf(const std::optional<Texts>& complete,
+                              const std::string& wavelengths) {
+  Vexdoc::LoadOptions options;
+  options.wavelengths = WavelengthsOf(wavelengths);
+  if (complete) {
+    options.completion = CompletionOf(*complete);
+    CheckWords(*options.completion);
+  }
+  return options;
+}
+
+// Who asks for completion wants a document that can be saved.
+void CheckComplete(const Vexdoc::LoadReport& report) {
+  if (report.completion.missing_count == 0) {
+    return;
+  }
+  const auto& first = report.completion.missing.front();
+  std::string text = "set '" + first.set + "', sample '" + first.sample +
+                     "': the conditions of a " + (first.is_spectrum ? "spectrum" : "colour") +
+                     " lack ";
+  for (const std::string& key : first.keys) {
+    text += (&key == &first.keys.front() ? "" : ", ") + key;
+  }
+  if (report.completion.missing_count > 1) {
+    text += "; and " + std::to_string(report.completion.missing_count - 1) + " more attributes";
+  }
+  throw Vexdoc::MissingConditionException(text + "; complete={KEY: VALUE} gives them", "");
+}
+
+Owner<VEX> Load(const py::object& given, bool cache, const std::optional<Texts>& complete,
+                const std::string& wavelengths) {
   const Path path(given);
+  Vexdoc::LoadOptions options = OptionsOf(complete, wavelengths);
+  options.cache = cache ? Vexdoc::CacheUse::kReadAndWrite : Vexdoc::CacheUse::kRead;
   const LibraryLock lock;
   const SmartPointer<VEX> document(new VEX);
+  Vexdoc::LoadReport report;
   try {
     const LibraryAlone library;
-    document->LoadXML(File(path.bytes), cache);
+    report = document->LoadXML(File(path.bytes), options);
   } catch (const Vexdoc::VexException& e) {
     if (const int error = ErrorOfReading(path.bytes)) {
       ThrowFileError(error, path.name, &e);
@@ -97,19 +184,26 @@ Owner<VEX> Load(const py::object& given, bool cache) {
     }
     ThrowAs("ParseError", e);
   }
+  CheckComplete(report);
   return Owner<VEX>(document);
 }
 
-Owner<VEX> Loads(const std::string& text) {
+Owner<VEX> Loads(const std::string& text, const std::optional<Texts>& complete,
+                 const std::string& wavelengths) {
   std::istringstream in(text);
+  const Vexdoc::LoadOptions options = OptionsOf(complete, wavelengths);
   const LibraryLock lock;
   const SmartPointer<VEX> document(new VEX);
+  Vexdoc::LoadReport report;
   try {
     const LibraryAlone library;
-    document->Load(in);
+    report = document->Load(in, options);
+  } catch (const Vexdoc::WavelengthException&) {
+    throw;
   } catch (const Vexdoc::VexException& e) {
     ThrowAs("ParseError", e);
   }
+  CheckComplete(report);
   return Owner<VEX>(document);
 }
 
@@ -138,8 +232,6 @@ py::bytes Dumps(const VEX& document) {
 }
 
 // ---- building
-
-using Texts = std::map<std::string, std::string>;
 
 void Apply(const Texts& texts, Vexdoc::Conditions& conditions) {
   for (const auto& [key, value] : texts) {
@@ -399,16 +491,30 @@ void AddDocuments(py::module_& module) {
   AddSampleClass(module);
   AddSetClass(module);
   AddDocumentClass(module);
-  module.def("load", &Load, R"(load(path, cache=False)
+  module.def("load", &Load,
+             R"(load(path, cache=False, *, complete=None, wavelengths="check")
 --
 
-The document in an XML file, or in the cache beside it if that is newer.
+The document in an XML file, or in the cache beside it if that is newer.  What has no dates in the
+file has none in the document.
 
-With `cache`, that is written after the XML was read.
-Raises FileError, or ParseError with the place where the file is no document.)",
-             arg("path"), arg("cache") = false);
-  module.def("loads", &Loads, "loads(text)\n--\n\nThe document in XML, as `dumps` gives it.",
-             arg("text"));
+cache: that is written after the XML was read.
+complete: conditions, key to value, for spectra and colours that lack mandatory ones; {} for the
+    number of points alone, which comes from the data.
+wavelengths: what is done about spectra whose wavelengths are not those of their conditions, which
+    are all that a document keeps.  "check" raises WavelengthError; "complete" takes the range from
+    the points, if they have one step, and else raises it; "as told" takes what the conditions say.
+
+Raises FileError, ParseError with the place where the file is no document, WavelengthError, or
+MissingConditionError for what is still missing after a completion.)",
+             arg("path"), arg("cache") = false, py::kw_only(), arg("complete") = py::none(),
+             arg("wavelengths") = "check");
+  module.def("loads", &Loads, R"(loads(text, *, complete=None, wavelengths="check")
+--
+
+The document in XML, as `dumps` gives it; arguments as for load.)",
+             arg("text"), py::kw_only(), arg("complete") = py::none(),
+             arg("wavelengths") = "check");
 }
 
 }  // namespace Aldermoor::Python

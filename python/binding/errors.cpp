@@ -67,6 +67,8 @@ void Translate(std::exception_ptr thrown) {
     const py::object error = MakeError("ParseError", e);
     error.attr("file") = TextOf(e.GetFile().c_str());
     Set(error);
+  } catch (const Vexdoc::WavelengthException& e) {
+    Set("WavelengthError", e);
   } catch (const Vexdoc::VexParseException& e) {
     Set("ParseError", e);
   } catch (const Vexdoc::MissingConditionException& e) {

@@ -1,8 +1,10 @@
 #include "aldermoor/vexdoc/internals/wavelengths.h"
 
 #include <algorithm>
+#include <charconv>
 #include <limits>
 #include <stdexcept>
+#include <system_error>
 
 #include "aldermoor/utilities/tools/lexicalcast.h"
 #include "aldermoor/vexdoc/conditionkeys.h"
@@ -39,6 +41,13 @@ std::string PointsText(const Wavelengths& points) {
 }  // namespace
 
 std::optional<std::int16_t> ReadWavelength(const std::string& text) {
+  // The common form without a stream; samples in great numbers are asked for theirs.
+  std::int16_t wavelength = 0;
+  const char* const end = text.data() + text.size();
+  const auto [stopped, error] = std::from_chars(text.data(), end, wavelength);
+  if (error == std::errc() && (stopped == end || *stopped == 'n')) {
+    return wavelength;
+  }
   try {
     return Utilities::Tools::lexical_cast<std::int16_t>(text);
   } catch (const std::invalid_argument&) {
