@@ -195,7 +195,8 @@ TEST_F(ConvertTest, LegacyDocumentIsCompletedOrRefusedWithTheSample) {
   const std::string given =
       " --condition Colorimetric.Illumination=A --condition Physical.SpectrumType=Emission"
       " --condition Physical.WavelengthSpectrumMax=";
-  ExpectRefused("a.xml old.xml" + given + "401nm", "3 points at 400, 500, 600 nm, but the conditions say from '400nm' to '401nm'", 1);
+  ExpectRefused("a.xml old.xml" + given + "401nm",
+                "3 points at 400, 500, 600 nm, but the conditions say from '400nm' to '401nm'", 1);
   ExpectRefused("a.xml old.xml" + given + "200nm", "conditions say from '400nm' to '200nm'", 1);
   const Result result = Run("convert a.xml b.xml" + given + "600nm");
   EXPECT_EQ(result.status, 0);

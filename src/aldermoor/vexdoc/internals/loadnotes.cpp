@@ -108,7 +108,7 @@ void LoadNotes::Settle(VEX& document, const LoadOptions& options, LoadReport& re
   }
   report.contradictions = illuminations_;
   report.contradiction_count = illuminations_.size();
-  FindContradictions(document, options.completion.has_value(), report);
+  FindContradictions(document, options, report);
   if (report.contradiction_count > 0 && options.wavelengths != WavelengthUse::kReport) {
     Refuse(report);
   }
@@ -131,18 +131,22 @@ void LoadNotes::TakeRanges(const VEX& document, LoadReport& report) const {
   });
 }
 
-void LoadNotes::FindContradictions(const VEX& document, bool is_completed,
+void LoadNotes::FindContradictions(const VEX& document, const LoadOptions& options,
                                    LoadReport& report) const {
   Agreement agreement;
   ForEachSpectrum(document, [&](const SampleSet& set, const Sample& sample,
                                 const SampleAttribute& spectrum, const Wavelengths& points) {
     const Conditions& conditions = *spectrum.GetConditions();
-    if (agreement.Of(points, conditions) || (is_completed && !NamesRange(conditions))) {
+    if (agreement.Of(points, conditions) || (options.completion && !NamesRange(conditions))) {
       return;
     }
     if (++report.contradiction_count <= LoadReport::kMostListed) {
       report.contradictions.push_back(
-          {set.GetName(), sample.GetName(), ContradictionText(points, conditions)});
+          {set.GetName(), sample.GetName(),
+           ContradictionText(points, conditions) +
+               (options.wavelengths == WavelengthUse::kComplete
+                    ? "; the points have no one step, or are beyond what conditions can say"
+                    : "")});
     }
   });
 }

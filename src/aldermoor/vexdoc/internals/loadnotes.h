@@ -39,7 +39,8 @@ class LoadNotes {
 
  private:
   void TakeRanges(const VEX& document, LoadReport& report) const;
-  void FindContradictions(const VEX& document, bool is_completed, LoadReport& report) const;
+  void FindContradictions(const VEX& document, const LoadOptions& options,
+                          LoadReport& report) const;
   // Calls `visit(set, sample, spectrum, points)`.
   template <class Visit>
   void ForEachSpectrum(const VEX& document, Visit visit) const;
