@@ -109,7 +109,9 @@ std::string Rebuild(const std::string& path) {
   LoadStored(path, document);  // before the cache goes, which may be all that is left
   WaitOutTheSecondOf(path);
   Remove(path);
-  document.LoadXML(File(path), true);
+  Vexdoc::LoadOptions options;
+  options.cache = Vexdoc::CacheUse::kReadAndWrite;
+  document.LoadXML(File(path), options);
   const std::string why_not = WhyNotUsed(path, CachePath(path));
   if (!why_not.empty()) {
     throw std::runtime_error(fmt::format("{}: the cache is not used: {}", path, why_not));

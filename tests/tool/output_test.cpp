@@ -104,6 +104,7 @@ TEST_F(OutputTest, NoInputIsReplacedByWhatIsNoDocument) {
     EXPECT_EQ(Shell("cmp before a.xml && cmp cache Cache/a.vexb").status, 0) << command;
     EXPECT_EQ(Shell("test -L d/link && test a.xml -ef hard").status, 0) << command;
   }
+  EXPECT_EQ(Run("spectrum 50,0,0 --save new -o d/../new").status, 2) << "two outputs in one";
   EXPECT_EQ(Shell("ls | grep -c '\\.......$'").out, "0\n") << "no temporary file is left";
 }
 

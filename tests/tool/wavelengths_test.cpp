@@ -85,7 +85,8 @@ TEST_F(WavelengthsTest, CompleteTakesTheRangeFromThePointsAndSaysSo) {
 
 TEST_F(WavelengthsTest, ColorsAreNotComputedOfSpectraOnAnotherGrid) {
   WriteSpectrum("a.xml", 400, "400nm", "750nm");
-  for (const char* const command : {"color a.xml", "density a.xml", "classify a.xml"}) {
+  for (const char* const command :
+       {"color a.xml", "density a.xml", "classify a.xml", "diff a.xml a.xml"}) {
     const Result result = Run(command);
     EXPECT_EQ(result.status, 1) << command;
     EXPECT_TRUE(Holds(result.err, "the spectrum is from 400nm to 750nm")) << command;

@@ -106,7 +106,9 @@ void LoadNotes::Settle(VEX& document, const LoadOptions& options, LoadReport& re
   if (options.completion) {
     report.completion = CompleteConditions(document, *options.completion);
   }
-  report.contradictions = illuminations_;
+  const std::size_t listed = std::min(LoadReport::kMostListed, illuminations_.size());
+  report.contradictions.assign(illuminations_.begin(),
+                               illuminations_.begin() + static_cast<std::ptrdiff_t>(listed));
   report.contradiction_count = illuminations_.size();
   FindContradictions(document, options, report);
   if (report.contradiction_count > 0 && options.wavelengths != WavelengthUse::kReport) {
