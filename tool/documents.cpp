@@ -70,15 +70,20 @@ Vexdoc::LoadReport LoadDocument(const std::string& path, Vexdoc::VEX& document,
                                 Vexdoc::WavelengthUse wavelengths) {
   Vexdoc::LoadOptions options;
   options.wavelengths = wavelengths;
-  if (path == kStandardStream) {
-    std::istringstream in(ReadBytes(path));
-    return TryLoad(path, [&] { return document.Load(in, options); });
-  }
+  const bool standard = path == kStandardStream;
+  std::istringstream in(standard ? ReadBytes(path) : "");
   NoteInput(path);
-  return TryLoad(path, [&] {
-    CheckIsFile(path);
-    return document.LoadXML(Utilities::FileSystem::File(path), options);
-  });
+  try {
+    return TryLoad(path, [&] {
+      if (standard) {
+        return document.Load(in, options);
+      }
+      CheckIsFile(path);
+      return document.LoadXML(Utilities::FileSystem::File(path), options);
+    });
+  } catch (const RefusedError& e) {
+    throw InputError(e.what());  // one of several inputs, of which the others may be good
+  }
 }
 
 void InputOptions::AddTo(CLI::App& app) {

@@ -26,7 +26,7 @@ Vexdoc::LoadReport TryLoad(const std::string& path,
                            const std::function<Vexdoc::LoadReport()>& load);
 
 /// Reads a document, from standard input for "-", and notes it as an input.
-/// Throws: what TryLoad throws.
+/// Throws: InputError, also for what TryLoad refuses.
 Vexdoc::LoadReport LoadDocument(const std::string& path, Vexdoc::VEX& document,
                                 Vexdoc::WavelengthUse wavelengths = Vexdoc::WavelengthUse::kRefuse);
 

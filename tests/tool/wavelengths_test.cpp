@@ -34,11 +34,11 @@ TEST_F(WavelengthsTest, PointsOtherThanThoseOfTheConditionsComeThroughNoCommand)
   const std::pair<const char*, int> cases[] = {
       {"color a.xml -o old.xml", 3},
       {"color - -o old.xml < a.xml", 3},
-      {"diff a.xml a.xml -o old.xml", 1},
+      {"diff a.xml a.xml -o old.xml", 3},
       {"density a.xml -o old.xml", 3},
       {"light a.xml -o old.xml", 3},
       {"classify a.xml -o old.xml", 3},
-      {"color good.xml --illuminant @a.xml:S/x -o old.xml", 1},
+      {"color good.xml --illuminant @a.xml:S/x -o old.xml", 3},
       {"convert a.xml old.xml", 1},
       {"convert a.xml old.xml --to csv", 1},
       {"merge a.xml good.xml -o old.xml", 1},
