@@ -17,6 +17,7 @@
 
 #include "command.h"
 #include "diagnostics.h"
+#include "inputfile.h"
 #include "options.h"
 #include "output.h"
 #include "text.h"
@@ -27,17 +28,6 @@ namespace {
 
 namespace fs = std::filesystem;
 using Utilities::FileSystem::File;
-
-// "Cache/paper.vexb" beside "paper.xml".
-std::string CachePath(const std::string& path) {
-  constexpr std::string_view kExtension = ".xml";
-  const File file(path);
-  std::string stem = file.GetName();
-  if (file.IsOfType(std::string(kExtension))) {
-    stem.resize(stem.size() - kExtension.size());
-  }
-  return (fs::path(path).parent_path() / "Cache" / (stem + ".vexb")).string();
-}
 
 std::optional<struct stat> StatusOf(const std::string& path) {
   struct stat status {};
@@ -119,7 +109,9 @@ std::string Rebuild(const std::string& path) {
   LoadStored(path, document);  // before the cache goes, which may be all that is left
   WaitOutTheSecondOf(path);
   Remove(path);
-  document.LoadXML(File(path), true);
+  Vexdoc::LoadOptions options;
+  options.cache = Vexdoc::CacheUse::kReadAndWrite;
+  document.LoadXML(File(path), options);
   const std::string why_not = WhyNotUsed(path, CachePath(path));
   if (!why_not.empty()) {
     throw std::runtime_error(fmt::format("{}: the cache is not used: {}", path, why_not));

@@ -14,6 +14,7 @@
 #include "command.h"
 #include "diagnostics.h"
 #include "documents.h"
+#include "faults.h"
 #include "inputfile.h"
 #include "output.h"
 #include "records.h"
@@ -38,7 +39,7 @@ struct Findings {
     std::istringstream in(std::move(bytes));
     faults = is_cache ? Vexdoc::CheckCache(in) : Vexdoc::CheckXML(in);
     for (const Fault& fault : faults) {
-      ++(fault.severity == Fault::Severity::kError ? errors : warnings);
+      (fault.severity == Fault::Severity::kError ? errors : warnings) += 1 + fault.repeats;
     }
   }
 
@@ -53,20 +54,11 @@ const char* Name(Fault::Severity severity) {
   return severity == Fault::Severity::kError ? "error" : "warning";
 }
 
-std::string PlaceText(const Findings& findings, const Fault& fault) {
-  if (findings.is_cache) {
-    return fmt::format(":0x{:08x}", fault.offset);
-  }
-  return fault.line == 0 ? "" : fmt::format(":{}:{}", fault.line, fault.column);
-}
-
 std::string ToText(const Findings& findings) {
   const std::string path = OnOneLine(ShownPath(findings.path));
   std::string out;
   for (const Fault& fault : findings.faults) {
-    out += fmt::format("{}{}: {}{}\n", path, PlaceText(findings, fault),
-                       fault.severity == Fault::Severity::kWarning ? "warning: " : "",
-                       OnOneLine(fault.text));
+    out += (findings.is_cache ? CacheFaultText : FaultText)(findings.path, fault) + "\n";
   }
   if (findings.faults.empty()) {
     return fmt::format("{}: in order\n", path);
@@ -85,6 +77,9 @@ ordered_json ToJson(const Findings& findings) {
     } else if (fault.line != 0) {
       item["line"] = fault.line;
       item["column"] = fault.column;
+    }
+    if (fault.repeats > 0) {
+      item["repeats"] = fault.repeats;
     }
     faults.push_back(std::move(item));
   }

@@ -7,6 +7,7 @@
 
 #include "aldermoor/measure/measureexception.h"
 #include "aldermoor/vexdoc/colorvector.h"
+#include "aldermoor/vexdoc/wavelengthrange.h"
 
 #include "requestedcolor.h"
 #include "vocabulary.h"
@@ -32,13 +33,9 @@ std::optional<Measure::Context> MakeContext(const Vexdoc::Conditions& request, b
 /// there is more to find out.
 const Vexdoc::Spectrum* DecidingSpectrum(const Vexdoc::Sample& sample,
                                          const Vexdoc::Conditions& request) {
-  const auto& elements = sample.GetElements();
-  const bool has_color = std::any_of(elements.begin(), elements.end(), [&](const auto& element) {
-    return dynamic_cast<const Vexdoc::ColorVector*>(element.second.Get()) != nullptr &&
-           request.IsSubsetOf(*element.second->GetConditions());
-  });
-  const Vexdoc::Spectrum* const spectrum = has_color ? nullptr : FindSpectrum(sample);
-  return spectrum != nullptr && spectrum->GetData().size() == kBands ? spectrum : nullptr;
+  const Vexdoc::Spectrum* const spectrum =
+      Vexdoc::HoldsColor(sample, request) ? nullptr : FindSpectrum(sample);
+  return spectrum != nullptr && Vexdoc::IsOnMeasuringGrid(*spectrum) ? spectrum : nullptr;
 }
 
 }  // namespace

@@ -8,6 +8,7 @@
 #include "aldermoor/measure/measureexception.h"
 #include "aldermoor/vexdoc/colorvector.h"
 #include "aldermoor/vexdoc/spectrum.h"
+#include "aldermoor/vexdoc/wavelengthrange.h"
 
 #include "requestedcolor.h"
 #include "samplerun.h"
@@ -18,7 +19,7 @@ namespace {
 
 bool HasBands(const Vexdoc::Sample& sample) {
   const Vexdoc::Spectrum* const spectrum = FindSpectrum(sample);
-  return spectrum != nullptr && spectrum->GetData().size() == kBands;
+  return spectrum != nullptr && Vexdoc::IsOnMeasuringGrid(*spectrum);
 }
 
 bool Reflects(const Vexdoc::Sample& sample) {

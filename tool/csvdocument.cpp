@@ -14,6 +14,7 @@
 
 #include "aldermoor/vexdoc/colorvector.h"
 #include "aldermoor/vexdoc/spectrum.h"
+#include "aldermoor/vexdoc/wavelengthrange.h"
 
 #include "csvlayout.h"
 #include "csvreader.h"
@@ -198,8 +199,8 @@ class CsvImport {
     conditions.emplace(kWavelengthMinKey, fmt::format("{}nm", kFirstBand));
     conditions.emplace(kWavelengthMaxKey, fmt::format("{}nm", kLastBand));
     if (conditions[kPointCountKey] != std::to_string(kBands) ||
-        Wavelength(conditions[kWavelengthMinKey]) != kFirstBand ||
-        Wavelength(conditions[kWavelengthMaxKey]) != kLastBand) {
+        Vexdoc::NanometresOf(conditions[kWavelengthMinKey]) != kFirstBand ||
+        Vexdoc::NanometresOf(conditions[kWavelengthMaxKey]) != kLastBand) {
       faults_.Add(place, "the conditions name other wavelengths; expected 36 from 380 to 730 nm");
     }
   }

@@ -8,7 +8,9 @@
 #include <fmt/format.h>
 
 #include "aldermoor/vexdoc/colorvector.h"
+#include "aldermoor/vexdoc/completion.h"
 #include "aldermoor/vexdoc/spectrum.h"
+#include "aldermoor/vexdoc/wavelengthrange.h"
 
 #include "csvdocument.h"
 #include "csvlayout.h"
@@ -118,7 +120,7 @@ class CsvExport {
     }
     const std::string first = conditions.GetAttribute(kWavelengthMinKey, "380nm");
     const std::string last = conditions.GetAttribute(kWavelengthMaxKey, "730nm");
-    if (Wavelength(first) != kFirstBand || Wavelength(last) != kLastBand) {
+    if (Vexdoc::NanometresOf(first) != kFirstBand || Vexdoc::NanometresOf(last) != kLastBand) {
       return fmt::format("a spectrum from {} to {}, expected 380nm to 730nm", first, last);
     }
     std::string fault = CommonFault(spectrum, spectrum_conditions_, "spectrum");
@@ -212,10 +214,12 @@ class CsvExport {
       WriteHeader(kSetPrefix, *set);
     }
     if (spectrum_conditions_ != nullptr) {
-      WriteConditions(*spectrum_conditions_, "Spectrum.", &IsOfSpectrum, color_conditions_);
+      WriteConditions(*spectrum_conditions_, "Spectrum.", &Vexdoc::IsConditionOfSpectra,
+                      color_conditions_);
     }
     if (color_conditions_ != nullptr) {
-      WriteConditions(*color_conditions_, "Color.", &IsOfColor, spectrum_conditions_);
+      WriteConditions(*color_conditions_, "Color.", &Vexdoc::IsConditionOfColors,
+                      spectrum_conditions_);
     }
   }
 

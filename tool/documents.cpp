@@ -49,17 +49,16 @@ std::string Reason(const std::exception& e) {
 
 }  // namespace
 
-void LoadDocument(const std::string& path, Vexdoc::VEX& document) {
-  const bool standard = path == kStandardStream;
+Vexdoc::LoadReport TryLoad(const std::string& path,
+                           const std::function<Vexdoc::LoadReport()>& load) {
   const std::string shown = ShownPath(path);
-  std::istringstream in(standard ? ReadBytes(path) : "");
   try {
-    if (standard) {
-      document.Load(in);
-    } else {
-      CheckIsFile(path);
-      document.LoadXML(Utilities::FileSystem::File(path), false);
-    }
+    return load();
+  } catch (const Vexdoc::WavelengthException& e) {
+    throw RefusedError(fmt::format(
+        "{}: {}; 'aldermoor convert --complete' takes the range from the points, if they have one "
+        "step",
+        shown, Reason(e)));
   } catch (const Vexdoc::VexXMLParseException& e) {
     throw InputError(fmt::format("{}:{}:{}: {}", shown, e.GetLine(), e.GetColumn(), Reason(e)));
   } catch (const std::exception& e) {
@@ -67,21 +66,46 @@ void LoadDocument(const std::string& path, Vexdoc::VEX& document) {
   }
 }
 
+Vexdoc::LoadReport LoadDocument(const std::string& path, Vexdoc::VEX& document,
+                                Vexdoc::WavelengthUse wavelengths) {
+  Vexdoc::LoadOptions options;
+  options.wavelengths = wavelengths;
+  const bool standard = path == kStandardStream;
+  std::istringstream in(standard ? ReadBytes(path) : "");
+  NoteInput(path);
+  try {
+    return TryLoad(path, [&] {
+      if (standard) {
+        return document.Load(in, options);
+      }
+      CheckIsFile(path);
+      return document.LoadXML(Utilities::FileSystem::File(path), options);
+    });
+  } catch (const RefusedError& e) {
+    throw InputError(e.what());  // one of several inputs, of which the others may be good
+  }
+}
+
 void InputOptions::AddTo(CLI::App& app) {
   AddArguments(app, "FILE", paths, "Documents to read; - is standard input");
 }
 
-bool InputOptions::TryLoad(const std::string& path, Vexdoc::VEX& document) {
+std::optional<Vexdoc::LoadReport> InputOptions::LoadOrReport(const std::string& path,
+                                                             Vexdoc::VEX& document,
+                                                             Vexdoc::WavelengthUse wavelengths) {
   try {
-    LoadDocument(path, document);
-    return true;
+    return LoadDocument(path, document, wavelengths);
   } catch (const InputError& e) {
     Report(e.what());
-    return false;
+    return std::nullopt;
   }
 }
 
 void InputOptions::CheckStandardInput(const std::string& other) const {
+  for (const std::string& path : paths) {
+    NoteInput(path);
+  }
+  NoteInput(other);
   const auto count =
       std::count(paths.begin(), paths.end(), kStandardStream) + (other == kStandardStream ? 1 : 0);
   if (count > 1) {

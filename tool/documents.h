@@ -2,10 +2,13 @@
 #define ALDERMOOR_TOOL_DOCUMENTS_H
 
 #include <cstddef>
+#include <functional>
 #include <optional>
 #include <string>
+#include <type_traits>
 #include <vector>
 
+#include "aldermoor/vexdoc/loadoptions.h"
 #include "aldermoor/vexdoc/vex.h"
 
 #include "exitstatus.h"
@@ -16,9 +19,16 @@ class App;
 
 namespace Aldermoor::Tool {
 
-/// Reads a document, from standard input for "-".
-/// Throws: InputError with the place of the fault in front, as far as it is known.
-void LoadDocument(const std::string& path, Vexdoc::VEX& document);
+/// Calls `load`, which reads `path`, and turns what it throws into messages.
+/// Throws: InputError with the place of the fault in front, as far as it is known; RefusedError for
+/// spectra whose wavelengths are not those of their conditions.
+Vexdoc::LoadReport TryLoad(const std::string& path,
+                           const std::function<Vexdoc::LoadReport()>& load);
+
+/// Reads a document, from standard input for "-", and notes it as an input.
+/// Throws: InputError, also for what TryLoad refuses.
+Vexdoc::LoadReport LoadDocument(const std::string& path, Vexdoc::VEX& document,
+                                Vexdoc::WavelengthUse wavelengths = Vexdoc::WavelengthUse::kRefuse);
 
 /// The argument "FILE...".
 struct InputOptions {
@@ -26,15 +36,21 @@ struct InputOptions {
 
   void AddTo(CLI::App& app);
 
-  /// Reads the documents one after the other and calls `visit(path, document)` for each; reports
-  /// one that cannot be read and goes on.  Returns kUnreadable if there was such a one.
+  /// Reads the documents one after the other and calls `visit(path, document)`, or with the report
+  /// behind it, for each; reports one that cannot be read and goes on.  Returns kUnreadable if
+  /// there was such a one.
   template <class Visit>
-  ExitStatus ForEachDocument(Visit visit) const {
+  ExitStatus ForEachDocument(
+      Visit visit, Vexdoc::WavelengthUse wavelengths = Vexdoc::WavelengthUse::kRefuse) const {
     ExitStatus status = ExitStatus::kDone;
     for (const std::string& path : paths) {
       Vexdoc::VEX document;
-      if (TryLoad(path, document)) {
-        visit(path, document);
+      if (const auto report = LoadOrReport(path, document, wavelengths)) {
+        if constexpr (std::is_invocable_v<Visit, const std::string&, Vexdoc::VEX&>) {
+          visit(path, document);
+        } else {
+          visit(path, document, *report);
+        }
       } else {
         status = ExitStatus::kUnreadable;
       }
@@ -42,11 +58,14 @@ struct InputOptions {
     return status;
   }
 
-  /// Throws: UsageError if standard input is named more than once, `other` included.
+  /// Notes all as inputs, `other` included.
+  /// Throws: UsageError if standard input is named more than once.
   void CheckStandardInput(const std::string& other = "") const;
 
  private:
-  static bool TryLoad(const std::string& path, Vexdoc::VEX& document);
+  static std::optional<Vexdoc::LoadReport> LoadOrReport(const std::string& path,
+                                                        Vexdoc::VEX& document,
+                                                        Vexdoc::WavelengthUse wavelengths);
 };
 
 /// The options "--set" and "--sample".

@@ -31,6 +31,12 @@ class InputError : public std::runtime_error {
   using runtime_error::runtime_error;
 };
 
+/// An input can be read, but not as what it means, and nothing is made of it.
+class RefusedError : public InputError {
+ public:
+  using InputError::InputError;
+};
+
 }  // namespace Aldermoor::Tool
 
 #endif  // ALDERMOOR_TOOL_EXITSTATUS_H

@@ -35,6 +35,7 @@ class ExtractCommand : public Command {
     AddArgument(app, "FILE", input_, "Document to read; - is standard input");
     filter_.AddTo(app);
     AddRequiredOutputOption(app, output_);
+    complete_.AddTo(app);
     AddFlag(app, "--no-cache", no_cache_, "Leave the cache beside the file as it is");
   }
 
@@ -43,7 +44,9 @@ class ExtractCommand : public Command {
       throw UsageError("--set or --sample must say what to extract");
     }
     Vexdoc::VEX document;
-    LoadStored(input_, document);
+    Vexdoc::LoadOptions options;
+    options.wavelengths = complete_.GetUse();
+    ReportRanges(input_, LoadStored(input_, document, options));
     KeepOnly(document, [this](Vexdoc::SampleSet& set) {
       if (!filter_.TakesSet(set.GetName())) {
         return false;
@@ -65,6 +68,7 @@ class ExtractCommand : public Command {
   std::string input_;
   std::string output_;
   SampleFilter filter_;
+  CompleteOption complete_;
   bool no_cache_ = false;
 };
 

@@ -30,7 +30,10 @@ struct Block {
 
 /// What there is to say about one document.
 struct Summary {
-  explicit Summary(const Vexdoc::VEX& document) : header(document.GetAttributes()) {
+  Summary(const Vexdoc::VEX& document, const Vexdoc::LoadReport& report)
+      : header(document.GetAttributes()),
+        contradictions(report.contradictions),
+        contradiction_count(report.contradiction_count) {
     for (const auto& [name, set] : document.GetSampleSets()) {
       sets.emplace_back(name, set->GetSamples().size());
       samples += set->GetSamples().size();
@@ -47,6 +50,8 @@ struct Summary {
   std::size_t samples = 0;
   std::map<std::string, std::size_t> kinds;
   std::vector<Block> blocks;  // in the order in which the document uses them
+  std::vector<Vexdoc::LoadReport::Contradiction> contradictions;
+  std::size_t contradiction_count = 0;
 
  private:
   void Count(const Vexdoc::SampleAttribute& attribute) {
@@ -82,6 +87,21 @@ void AppendPairs(std::string& out, const char* indent,
   }
 }
 
+void AppendContradictions(std::string& out, const Summary& summary) {
+  constexpr std::size_t kMostShown = 10;
+  if (summary.contradictions.empty()) {
+    return;
+  }
+  out += "  wavelengths that are not those of the conditions\n";
+  const std::size_t shown = std::min(kMostShown, summary.contradictions.size());
+  for (std::size_t i = 0; i < shown; ++i) {
+    out += "    " + OnOneLine(summary.contradictions[i].Text()) + "\n";
+  }
+  if (summary.contradiction_count > shown) {
+    out += fmt::format("    and {} more\n", summary.contradiction_count - shown);
+  }
+}
+
 std::string ToText(const std::string& path, const Summary& summary) {
   std::string out = OnOneLine(path) + "\n";
   AppendPairs(out, "  ", summary.header);
@@ -100,6 +120,7 @@ std::string ToText(const std::string& path, const Summary& summary) {
                        block.conditions.HasCustomIllumination() ? ", with an illuminant" : "");
     AppendPairs(out, "    ", block.conditions.GetAttributes());
   }
+  AppendContradictions(out, summary);
   return out;
 }
 
@@ -114,12 +135,17 @@ ordered_json ToJson(const std::string& path, const Summary& summary) {
                       {"customIllumination", block.conditions.HasCustomIllumination()},
                       {"attributes", block.conditions.GetAttributes()}});
   }
+  ordered_json spectra = ordered_json::array();
+  for (const auto& one : summary.contradictions) {
+    spectra.push_back({{"set", one.set}, {"sample", one.sample}, {"text", one.text}});
+  }
   return {{"file", path},
           {"header", summary.header},
           {"sets", sets},
           {"samples", summary.samples},
           {"attributes", summary.kinds},
-          {"conditions", blocks}};
+          {"conditions", blocks},
+          {"contradictions", {{"count", summary.contradiction_count}, {"spectra", spectra}}}};
 }
 
 class InfoCommand : public Command {
@@ -135,16 +161,19 @@ class InfoCommand : public Command {
     Output output(output_.path);
     std::size_t documents = 0;
     ordered_json results = ordered_json::array();
-    const ExitStatus status =
-        inputs_.ForEachDocument([&](const std::string& path, const Vexdoc::VEX& document) {
-          const Summary summary(document);
+    // What other commands refuse can be looked at here.
+    const ExitStatus status = inputs_.ForEachDocument(
+        [&](const std::string& path, const Vexdoc::VEX& document,
+            const Vexdoc::LoadReport& report) {
+          const Summary summary(document, report);
           if (json) {
             results.push_back(ToJson(path, summary));
           } else {
             output.Write((documents == 0 ? "" : "\n") + ToText(path, summary));
           }
           ++documents;
-        });
+        },
+        Vexdoc::WavelengthUse::kReport);
     if (documents == 0) {
       return status;  // the old output stays
     }

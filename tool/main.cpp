@@ -173,6 +173,9 @@ ExitStatus Main(int argc, char** argv) {
                            kExitStatusText));
     const Commands commands = AddCommands(app);
     return ParseAndRun(app, commands, argc, argv);
+  } catch (const RefusedError& e) {
+    Report(e.what());
+    return ExitStatus::kSomeFailed;
   } catch (const InputError& e) {
     Report(e.what());
     return ExitStatus::kUnreadable;

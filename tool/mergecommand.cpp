@@ -39,17 +39,18 @@ class MergeCommand : public Command {
   void AddOptions(CLI::App& app) override {
     inputs_.AddTo(app);
     AddRequiredOutputOption(app, output_);
+    complete_.AddTo(app);
     AddFlag(app, "--no-cache", no_cache_, "Leave the cache beside the file as it is");
   }
 
   ExitStatus Run() override {
     inputs_.CheckStandardInput();
     Vexdoc::VEX merged;
-    LoadStored(inputs_.paths.front(), merged);
+    Load(inputs_.paths.front(), merged);
     const auto header = merged.GetAttributes();
     for (auto path = std::next(inputs_.paths.begin()); path != inputs_.paths.end(); ++path) {
       Vexdoc::VEX document;
-      LoadStored(*path, document);
+      Load(*path, document);
       ReportLostHeader(*path, merged, document);
       for (const auto& [key, set] : document.GetSampleSets()) {
         const std::string name = set->GetName();
@@ -67,8 +68,15 @@ class MergeCommand : public Command {
   }
 
  private:
+  void Load(const std::string& path, Vexdoc::VEX& document) const {
+    Vexdoc::LoadOptions options;
+    options.wavelengths = complete_.GetUse();
+    ReportRanges(path, LoadStored(path, document, options));
+  }
+
   InputOptions inputs_;
   std::string output_;
+  CompleteOption complete_;
   bool no_cache_ = false;
 };
 

@@ -11,6 +11,10 @@
 #include <sys/stat.h>
 #include <unistd.h>
 
+#include "diagnostics.h"
+#include "exitstatus.h"
+#include "inputfile.h"
+
 namespace Aldermoor::Tool {
 namespace {
 
@@ -24,21 +28,42 @@ unsigned int DefaultMode() {
 
 }  // namespace
 
+void ReportReplacedInput(const std::string& path) {
+  if (const std::string input = InputThatIs(path); !input.empty()) {
+    Report(fmt::format("{}: the input is replaced", input));
+  }
+}
+
 OutputError::OutputError(const std::string& target, int error)
     : runtime_error(
           fmt::format("{} cannot be written: {}", target, std::generic_category().message(error))),
       broken_pipe_(error == EPIPE) {}
 
-Output::Output(const std::string& path) {
+Output::Output(const std::string& path, Content content) : content_(content) {
   if (path == kStandardStream) {
     shown_ = "standard output";
     descriptor_ = STDOUT_FILENO;
   } else {
     shown_ = path;
     target_ = path;
+  }
+  CheckInputs();  // those that are known, before the work
+  if (path != kStandardStream) {
     Open(path);
     owned_ = true;
   }
+}
+
+void Output::CheckInputs() const {
+  struct stat status {};
+  const int failed = target_.empty() ? fstat(descriptor_, &status) : stat(target_.c_str(), &status);
+  const std::string input = failed == 0 ? InputThatIs(status) : "";
+  // What goes to standard output would be mixed with what is there.
+  if (input.empty() || (content_ == Content::kDocument && !target_.empty())) {
+    return;
+  }
+  throw UsageError(
+      fmt::format("{} would be written over the input {}; nothing is written", shown_, input));
 }
 
 Output::~Output() {
@@ -89,6 +114,9 @@ void Output::Write(std::string_view text) {
 }
 
 void Output::Flush() {
+  if (temporary_.empty()) {
+    CheckInputs();
+  }
   std::string_view rest = buffer_;
   while (!rest.empty()) {
     const ssize_t written = write(descriptor_, rest.data(), rest.size());
@@ -114,6 +142,10 @@ void Output::Commit() {
     Fail(errno);
   }
   if (!temporary_.empty()) {
+    CheckInputs();
+    if (content_ == Content::kDocument) {
+      ReportReplacedInput(target_);
+    }
     if (std::rename(temporary_.c_str(), target_.c_str()) != 0) {
       Fail(errno);
     }

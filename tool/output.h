@@ -21,14 +21,22 @@ class OutputError : public std::runtime_error {
   bool broken_pipe_;
 };
 
+/// Tells that the file `path`, which is about to be replaced by a document, is one that this run
+/// has read.
+void ReportReplacedInput(const std::string& path);
+
 /// Where results go: standard output, or a file that is complete or not there at all.
 ///
 /// A file is written beside its target and takes its place in Commit; without it, whatever was
-/// there stays.  Devices and pipes are written directly.  Throws: OutputError.
+/// there stays.  Devices and pipes are written directly.  A file that this run reads is refused,
+/// under whatever name, unless a document takes the place of its document: then that is told.
+/// Throws: OutputError; UsageError for a file that is read.
 class Output {
  public:
+  enum class Content { kResults, kDocument };
+
   /// Opens at once, so that a path that cannot be written fails before the work.
-  explicit Output(const std::string& path);
+  explicit Output(const std::string& path, Content content = Content::kResults);
   Output(const Output&) = delete;
   Output& operator=(const Output&) = delete;
   ~Output();
@@ -41,8 +49,10 @@ class Output {
   void Open(const std::string& path);
   void OpenTemporary(unsigned int mode);
   void Flush();
+  void CheckInputs() const;
   [[noreturn]] void Fail(int error) const;
 
+  Content content_;
   std::string shown_;      // the name in messages
   std::string target_;     // what the temporary is renamed to
   std::string temporary_;  // empty if there is none

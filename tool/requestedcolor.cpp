@@ -7,6 +7,7 @@
 
 #include "aldermoor/utilities/tools/smartpointer.h"
 #include "aldermoor/vexdoc/spectrum.h"
+#include "aldermoor/vexdoc/wavelengthrange.h"
 
 #include "vocabulary.h"
 
@@ -48,6 +49,9 @@ void CheckHoldsFor(const Vexdoc::Conditions& request, const Vexdoc::ColorVector&
 
 Vexdoc::ColorVector RequestedColor(const Vexdoc::Sample& sample,
                                    const Vexdoc::Conditions& request) {
+  if (const std::string fault = Vexdoc::GridFault(sample, request); !fault.empty()) {
+    throw std::runtime_error(fault);
+  }
   const auto result = sample.GetSampleAttribute(kColorVectorType, request, false);
   const auto& color = dynamic_cast<const Vexdoc::ColorVector&>(*result);
   CheckHoldsFor(request, color);

@@ -5,6 +5,7 @@
 #include <fmt/format.h>
 
 #include "aldermoor/vexdoc/conditions.h"
+#include "aldermoor/vexdoc/wavelengthrange.h"
 
 #include "diagnostics.h"
 #include "vocabulary.h"
@@ -61,6 +62,9 @@ const Vexdoc::Spectrum& SpectrumOf(const Vexdoc::Sample& sample) {
   if (spectrum->GetData().size() != kBands) {
     throw std::runtime_error(fmt::format("the spectrum has {} values instead of {}",
                                          spectrum->GetData().size(), kBands));
+  }
+  if (const std::string fault = Vexdoc::GridFault(*spectrum); !fault.empty()) {
+    throw std::runtime_error(fault);
   }
   return *spectrum;
 }

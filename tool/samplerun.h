@@ -47,7 +47,7 @@ bool TryFor(const Place& place, const Vexdoc::Sample& sample, Work work) {
 /// The first spectrum of the sample, or none.  The sample keeps it.
 const Vexdoc::Spectrum* FindSpectrum(const Vexdoc::Sample& sample);
 /// The first spectrum of the sample.  Throws: std::runtime_error if there is none or if it has
-/// other than 36 values.
+/// other than 36 values, or if these are not from 380 to 730 nm.
 const Vexdoc::Spectrum& SpectrumOf(const Vexdoc::Sample& sample);
 /// The same, of something that reflects.  Throws: also if its conditions say that it is a light.
 const Vexdoc::Spectrum& ReflectanceOf(const Vexdoc::Sample& sample);

@@ -2,11 +2,14 @@
 
 #include <algorithm>
 #include <charconv>
+#include <cstdint>
 #include <system_error>
 #include <vector>
 
 #include <fmt/format.h>
 #include <fmt/ranges.h>
+
+#include "aldermoor/vexdoc/completion.h"
 
 #include "diagnostics.h"
 #include "exitstatus.h"
@@ -28,12 +31,22 @@ bool IsWavelengthKey(const std::string& key) {
   return key == kWavelengthMinKey || key == kWavelengthMaxKey;
 }
 
+// Who types a wavelength means all of what is typed.
+bool IsWholeWavelength(std::string_view text) {
+  if (text.ends_with("nm")) {
+    text.remove_suffix(2);
+  }
+  std::int16_t wavelength = 0;
+  const auto [end, error] = std::from_chars(text.data(), text.data() + text.size(), wavelength);
+  return error == std::errc() && end == text.data() + text.size();
+}
+
 // `value` in the form that the library reads.
 std::string Checked(const std::string& what, const std::string& key, const std::string& value) {
   if (!IsWavelengthKey(key)) {
     return ConditionValue(what, key, value);
   }
-  if (!Wavelength(value)) {
+  if (!IsWholeWavelength(value)) {
     throw UsageError(fmt::format("{}: '{}' is no whole wavelength such as 380nm", what, value));
   }
   return value;
@@ -47,26 +60,6 @@ std::optional<Setting> Setting::Parse(std::string_view text) {
     return std::nullopt;
   }
   return Setting{std::string(text.substr(0, equals)), std::string(text.substr(equals + 1))};
-}
-
-std::optional<int> Wavelength(std::string_view text) {
-  if (text.ends_with("nm")) {
-    text.remove_suffix(2);
-  }
-  int wavelength = 0;
-  const auto [end, error] = std::from_chars(text.data(), text.data() + text.size(), wavelength);
-  if (error != std::errc() || end != text.data() + text.size()) {
-    return std::nullopt;
-  }
-  return wavelength;
-}
-
-bool IsOfSpectrum(std::string_view key) {
-  return key.starts_with("Physical.") || key == kCustomKey;
-}
-
-bool IsOfColor(std::string_view key) {
-  return key.starts_with("Color") || key == kCustomKey;
 }
 
 bool IsInVocabulary(const std::string& key, const std::string& value) {
@@ -99,10 +92,10 @@ void KindConditions::Add(const std::string& what, const Setting& setting) {
         key, fmt::join(AllKeys(), ", ")));
   }
   const std::string value = Checked(what + " " + key, key, std::string(Trimmed(setting.value)));
-  if (IsOfSpectrum(key)) {
+  if (Vexdoc::IsConditionOfSpectra(key)) {
     spectrum.emplace(key, value);
   }
-  if (IsOfColor(key)) {
+  if (Vexdoc::IsConditionOfColors(key)) {
     color.emplace(key, value);
   }
 }

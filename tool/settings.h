@@ -29,9 +29,6 @@ struct Setting {
   static std::optional<Setting> Parse(std::string_view text);
 };
 
-/// The whole nanometres of a condition such as "380nm" or "380"; nothing for any other text.
-std::optional<int> Wavelength(std::string_view text);
-
 /// Conditions of the two kinds that have mandatory ones.
 struct KindConditions {
   Texts spectrum;
@@ -57,10 +54,6 @@ struct ConditionOption {
   /// Adds them to `conditions`.  Throws: UsageError.
   void ApplyTo(KindConditions& conditions) const;
 };
-
-/// Where a condition belongs whose key has no prefix.
-bool IsOfSpectrum(std::string_view key);
-bool IsOfColor(std::string_view key);
 
 /// Whether KindConditions::Add takes `value` for `key` as it is.
 bool IsInVocabulary(const std::string& key, const std::string& value);

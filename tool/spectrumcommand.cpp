@@ -1,11 +1,13 @@
 #include <cstddef>
 #include <exception>
+#include <filesystem>
 #include <memory>
 #include <optional>
 #include <sstream>
 #include <stdexcept>
 #include <string>
 #include <string_view>
+#include <system_error>
 #include <utility>
 #include <vector>
 
@@ -92,6 +94,17 @@ void WriteDocument(Output& output, const std::vector<Found>& all) {
   output.Write(text.str());
 }
 
+// Also under two names; of files that are still to be made, by their paths.
+bool IsSameFile(const std::string& a, const std::string& b) {
+  namespace fs = std::filesystem;
+  std::error_code error;
+  if (a == b || fs::equivalent(a, b, error)) {
+    return true;
+  }
+  const fs::path whole = fs::weakly_canonical(fs::absolute(a), error);
+  return !whole.empty() && whole == fs::weakly_canonical(fs::absolute(b), error);
+}
+
 class SpectrumCommand : public Command {
  public:
   void AddOptions(CLI::App& app) override {
@@ -108,7 +121,7 @@ class SpectrumCommand : public Command {
   ExitStatus Run() override {
     const Format format = output_.GetFormat();
     const Vexdoc::Conditions request = MakeRequest();
-    if (save_ && *save_ == output_.path) {
+    if (save_ && IsSameFile(*save_, output_.path)) {
       throw UsageError("--save and --output name the same file");
     }
     const auto arguments = ParseColors();

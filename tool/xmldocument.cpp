@@ -3,69 +3,26 @@
 #include <algorithm>
 #include <exception>
 #include <filesystem>
-#include <map>
 #include <sstream>
 
 #include <fmt/format.h>
 
 #include "aldermoor/utilities/exceptions/exceptions.h"
 #include "aldermoor/utilities/filesystem/file.h"
-#include "aldermoor/utilities/tools/datetime.h"
 #include "aldermoor/vexdoc/inspection.h"
 #include "aldermoor/vexdoc/vexexception.h"
 
 #include "diagnostics.h"
 #include "documentdiff.h"
+#include "documents.h"
 #include "inputfile.h"
+#include "options.h"
 #include "output.h"
 
 namespace Aldermoor::Tool {
 namespace {
 
-using Utilities::Tools::DateTime;
 using Vexdoc::Header;
-
-/// Removes the dates that a load has put in: those of its own time that are not in the text.
-class DateFilter {
- public:
-  DateFilter(const std::string& text, std::string begin, std::string end)
-      : text_(text), begin_(std::move(begin)), end_(std::move(end)) {}
-
-  void Apply(Header& element) {
-    for (const char* const key : {Header::kCreatedKey, Header::kModifiedKey}) {
-      const std::string date = element.GetAttribute(key);
-      if (date >= begin_ && date <= end_ && !IsInText(date)) {
-        element.RemoveAttribute(key);
-      }
-    }
-  }
-
- private:
-  bool IsInText(const std::string& date) {
-    const auto [place, is_new] = known_.try_emplace(date, false);
-    if (is_new) {
-      place->second = text_.find(date) != std::string::npos;
-    }
-    return place->second;
-  }
-
-  const std::string& text_;
-  std::string begin_;
-  std::string end_;
-  std::map<std::string, bool> known_;
-};
-
-void Parse(const std::string& path, const std::string& text, Vexdoc::VEX& document) {
-  std::istringstream in(text);
-  try {
-    document.Load(in);
-  } catch (const Vexdoc::VexXMLParseException& e) {
-    throw InputError(
-        fmt::format("{}:{}:{}: {}", ShownPath(path), e.GetLine(), e.GetColumn(), e.what()));
-  } catch (const std::exception& e) {
-    throw InputError(fmt::format("{}: {}", ShownPath(path), e.what()));
-  }
-}
 
 // Tells what a file would not bring back; whether there is nothing of the kind.
 bool IsSavable(const Vexdoc::VEX& document, const std::string& shown) {
@@ -119,20 +76,31 @@ void ForgetDates(Header& element) {
   element.RemoveAttribute(Header::kModifiedKey);
 }
 
-void LoadStored(const std::string& path, Vexdoc::VEX& document) {
-  const std::string text = ReadBytes(path);
-  const std::string begin = DateTime().GetDateTime();
-  Parse(path, text, document);
-  DateFilter dates(text, begin, DateTime().GetDateTime());
-  dates.Apply(document);
-  for (const auto& [set_name, set] : document.GetSampleSets()) {
-    dates.Apply(*set);
-    for (const auto& [sample_name, sample] : set->GetSamples()) {
-      dates.Apply(*sample);
-      for (const auto& [name, attribute] : sample->GetElements()) {
-        dates.Apply(*attribute);
-      }
-    }
+Vexdoc::LoadReport LoadStored(const std::string& path, Vexdoc::VEX& document,
+                              const Vexdoc::LoadOptions& options) {
+  return LoadStored(path, ReadBytes(path), document, options);
+}
+
+Vexdoc::LoadReport LoadStored(const std::string& path, const std::string& text,
+                              Vexdoc::VEX& document, const Vexdoc::LoadOptions& options) {
+  std::istringstream in(text);
+  return TryLoad(path, [&] { return document.Load(in, options); });
+}
+
+void CompleteOption::AddTo(CLI::App& app) {
+  AddFlag(app, "--complete", is_set,
+          "Where the wavelengths of a spectrum are not those of its conditions, take minimum, "
+          "maximum and number from its points, if they have one step");
+}
+
+Vexdoc::WavelengthUse CompleteOption::GetUse() const {
+  return is_set ? Vexdoc::WavelengthUse::kComplete : Vexdoc::WavelengthUse::kRefuse;
+}
+
+void ReportRanges(const std::string& path, const Vexdoc::LoadReport& report) {
+  for (const auto& [range, spectra] : report.ranges_taken) {
+    Report(fmt::format("{}: the range {} taken from the points of {} {}", ShownPath(path), range,
+                       spectra, spectra == 1 ? "spectrum" : "spectra"));
   }
 }
 
@@ -145,7 +113,7 @@ ExitStatus SaveChecked(const Vexdoc::VEX& document, const std::string& path, boo
     return ExitStatus::kSomeFailed;
   }
   if (standard) {
-    Output output(path);
+    Output output(path, Output::Content::kDocument);
     output.Write(text);
     output.Commit();
     return ExitStatus::kDone;
@@ -154,6 +122,7 @@ ExitStatus SaveChecked(const Vexdoc::VEX& document, const std::string& path, boo
     Utilities::FileSystem::File file(path);
     // Beside a device there is no place for a cache.
     const bool is_file = std::filesystem::is_regular_file(path) || !std::filesystem::exists(path);
+    ReportReplacedInput(path);
     document.SaveXML(file, cache && is_file);
     return ExitStatus::kDone;
   } catch (const Utilities::Exceptions::ResourceException& e) {

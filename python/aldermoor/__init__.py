@@ -38,6 +38,7 @@ from aldermoor._errors import (
     NotFoundError,
     ParseError,
     SaveError,
+    WavelengthError,
 )
 from aldermoor._results import ColorRendering, Fault, Item, SampleRows
 from aldermoor._words import (
@@ -75,6 +76,7 @@ __all__ = [
     "SampleSet",
     "SaveError",
     "Spectrum",
+    "WavelengthError",
     "__version__",
     "channels",
     "color_rendering",

@@ -15,6 +15,7 @@ from aldermoor._words import (
     Reconstructible,
     Source,
     SpectrumType,
+    WavelengthUse,
 )
 
 __version__: str
@@ -140,8 +141,19 @@ class Document(_Element):
     def dumps(self) -> bytes: ...
     def faults(self) -> list[Fault]: ...
 
-def load(path: _Path, cache: bool = False) -> Document: ...
-def loads(text: str | bytes) -> Document: ...
+def load(
+    path: _Path,
+    cache: bool = False,
+    *,
+    complete: Mapping[str, str] | None = None,
+    wavelengths: WavelengthUse = "check",
+) -> Document: ...
+def loads(
+    text: str | bytes,
+    *,
+    complete: Mapping[str, str] | None = None,
+    wavelengths: WavelengthUse = "check",
+) -> Document: ...
 def channels(space: ColorSpace) -> tuple[str, ...]: ...
 def convert(
     values: _Floats,

@@ -45,6 +45,14 @@ class SaveError(Error, ValueError):
     """All of them, in the order of the document."""
 
 
+class WavelengthError(ParseError):
+    """The wavelengths of spectra in a file are not those of their conditions.
+
+    The text names set, sample, points and conditions.  `load(..., wavelengths="complete")` takes
+    the range from points with one step, `wavelengths="as told"` that of the conditions.
+    """
+
+
 class NotFoundError(Error, LookupError):
     """There is no such set, sample or attribute, and nothing that could give it."""
 

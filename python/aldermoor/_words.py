@@ -14,6 +14,7 @@ DensityStandard = Literal["DIN", "DINNB", "ANSIA", "ANSIE", "ANSII", "ANSIT", "S
 SpectrumType = Literal["Remission", "Emission", "Transmission", "AmbientLight", "Flash"]
 Reconstructible = Literal["CIELab", "CIEXYZ", "RGB"]
 """Colour spaces with a way to CIELab."""
+WavelengthUse = Literal["check", "complete", "as told"]
 Spectra = Literal["Spectrum", "Emission"]
 Source = Spectra | ColorSpace
 Comparable = Spectra | Reconstructible
@@ -23,6 +24,7 @@ OBSERVERS: tuple[Observer, ...] = get_args(Observer)
 FORMULAS: tuple[Formula, ...] = get_args(Formula)
 DENSITY_STANDARDS: tuple[DensityStandard, ...] = get_args(DensityStandard)
 SPECTRUM_TYPES: tuple[SpectrumType, ...] = get_args(SpectrumType)
+WAVELENGTHS: tuple[WavelengthUse, ...] = get_args(WavelengthUse)
 SOURCES: tuple[str, ...] = (*get_args(Spectra), *COLOR_SPACES)
 RECONSTRUCTIBLE: tuple[Reconstructible, ...] = get_args(Reconstructible)
 

@@ -17,12 +17,14 @@
 #include "aldermoor/utilities/exceptions/exceptions.h"
 #include "aldermoor/vexdoc/colorvector.h"
 #include "aldermoor/vexdoc/inspection.h"
+#include "aldermoor/vexdoc/loadoptions.h"
 #include "aldermoor/vexdoc/spectrum.h"
 #include "aldermoor/vexdoc/vex.h"
 #include "aldermoor/vexdoc/vexexception.h"
 
 #include "attributes.h"
 #include "errors.h"
+#include "loading.h"
 #include "lock.h"
 #include "module.h"
 #include "request.h"
@@ -82,13 +84,17 @@ int ErrorOfWriting(std::string_view text) {
   return 0;
 }
 
-Owner<VEX> Load(const py::object& given, bool cache) {
+Owner<VEX> Load(const py::object& given, bool cache, const std::optional<Texts>& complete,
+                const std::string& wavelengths) {
   const Path path(given);
+  Vexdoc::LoadOptions options = OptionsOf(complete, wavelengths);
+  options.cache = cache ? Vexdoc::CacheUse::kReadAndWrite : Vexdoc::CacheUse::kRead;
   const LibraryLock lock;
   const SmartPointer<VEX> document(new VEX);
+  Vexdoc::LoadReport report;
   try {
     const LibraryAlone library;
-    document->LoadXML(File(path.bytes), cache);
+    report = document->LoadXML(File(path.bytes), options);
   } catch (const Vexdoc::VexException& e) {
     if (const int error = ErrorOfReading(path.bytes)) {
       ThrowFileError(error, path.name, &e);
@@ -98,19 +104,26 @@ Owner<VEX> Load(const py::object& given, bool cache) {
     }
     ThrowAs("ParseError", e);
   }
+  CheckComplete(report);
   return Owner<VEX>(document);
 }
 
-Owner<VEX> Loads(const std::string& text) {
+Owner<VEX> Loads(const std::string& text, const std::optional<Texts>& complete,
+                 const std::string& wavelengths) {
   std::istringstream in(text);
+  const Vexdoc::LoadOptions options = OptionsOf(complete, wavelengths);
   const LibraryLock lock;
   const SmartPointer<VEX> document(new VEX);
+  Vexdoc::LoadReport report;
   try {
     const LibraryAlone library;
-    document->Load(in);
+    report = document->Load(in, options);
+  } catch (const Vexdoc::WavelengthException&) {
+    throw;
   } catch (const Vexdoc::VexException& e) {
     ThrowAs("ParseError", e);
   }
+  CheckComplete(report);
   return Owner<VEX>(document);
 }
 
@@ -150,8 +163,6 @@ py::bytes Dumps(const VEX& document) {
 }
 
 // ---- building
-
-using Texts = std::map<std::string, std::string>;
 
 void Apply(const Texts& texts, Vexdoc::Conditions& conditions) {
   for (const auto& [key, value] : texts) {
@@ -419,16 +430,30 @@ void AddDocuments(py::module_& module) {
   AddSampleClass(module);
   AddSetClass(module);
   AddDocumentClass(module);
-  module.def("load", &Load, R"(load(path, cache=False)
+  module.def("load", &Load,
+             R"(load(path, cache=False, *, complete=None, wavelengths="check")
 --
 
-The document in an XML file, or in the cache beside it if that is newer.
+The document in an XML file, or in the cache beside it if that is newer.  What has no dates in the
+file has none in the document.
 
-With `cache`, that is written after the XML was read.
-Raises FileError, or ParseError with the place where the file is no document.)",
-             arg("path"), arg("cache") = false);
-  module.def("loads", &Loads, "loads(text)\n--\n\nThe document in XML, as `dumps` gives it.",
-             arg("text"));
+cache: that is written after the XML was read.
+complete: conditions, key to value, for spectra and colours that lack mandatory ones; {} for the
+    number of points alone, which comes from the data.
+wavelengths: what is done about spectra whose wavelengths are not those of their conditions, which
+    are all that a document keeps.  "check" raises WavelengthError; "complete" takes the range from
+    the points, if they have one step, and else raises it; "as told" takes what the conditions say.
+
+Raises FileError, ParseError with the place where the file is no document, WavelengthError, or
+MissingConditionError for what is still missing after a completion.)",
+             arg("path"), arg("cache") = false, py::kw_only(), arg("complete") = py::none(),
+             arg("wavelengths") = "check");
+  module.def("loads", &Loads, R"(loads(text, *, complete=None, wavelengths="check")
+--
+
+The document in XML, as `dumps` gives it; arguments as for load.)",
+             arg("text"), py::kw_only(), arg("complete") = py::none(),
+             arg("wavelengths") = "check");
 }
 
 }  // namespace Aldermoor::Python

@@ -68,6 +68,8 @@ void Translate(std::exception_ptr thrown) {
     const py::object error = MakeError("ParseError", e);
     error.attr("file") = TextOf(e.GetFile());
     Set(error);
+  } catch (const Vexdoc::WavelengthException& e) {
+    Set("WavelengthError", e);
   } catch (const Vexdoc::VexParseException& e) {
     Set("ParseError", e);
   } catch (const Vexdoc::MissingConditionException& e) {

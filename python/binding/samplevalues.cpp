@@ -12,6 +12,7 @@
 #include "aldermoor/utilities/exceptions/exceptions.h"
 #include "aldermoor/vexdoc/colorvector.h"
 #include "aldermoor/vexdoc/spectrum.h"
+#include "aldermoor/vexdoc/wavelengthrange.h"
 
 #include "lock.h"
 #include "request.h"
@@ -72,7 +73,20 @@ bool HoldsFor(const Vexdoc::Conditions& request, const Vexdoc::Conditions& own) 
           own.GetCustomIllumination().GetData() == request.GetCustomIllumination().GetData());
 }
 
+const Vexdoc::Spectrum& FindSpectrum(const Sample& sample, const std::optional<std::string>& type) {
+  for (const auto& [name, attribute] : sample.GetElements()) {
+    const auto* const spectrum = dynamic_cast<const Vexdoc::Spectrum*>(attribute.Get());
+    if (spectrum != nullptr && (!type || TypeOf(*spectrum) == *type)) {
+      return *spectrum;
+    }
+  }
+  throw ResourceNotAvailableException("the sample '" + sample.GetName() + "' has no spectrum", "");
+}
+
 std::vector<float> FindColor(const Sample& sample, const Vexdoc::Conditions& request) {
+  if (const std::string fault = Vexdoc::GridFault(sample, request); !fault.empty()) {
+    throw Measure::MeasureException(fault, "");
+  }
   const auto found = Utilities::Tools::DynamicCast<Vexdoc::ColorVector>(
       sample.GetSampleAttribute("VEXColorVector", request, false));
   if (!HoldsFor(request, *found->GetConditions())) {
@@ -150,7 +164,11 @@ py::object SpectraTable(const Container& container, const std::optional<std::str
   {
     const LibraryAlone library;
     table.Fill(container, [&](const Sample& sample) -> const std::vector<float>& {
-      return SpectrumOf(sample, type);
+      const Vexdoc::Spectrum& spectrum = FindSpectrum(sample, type);
+      if (const std::string fault = Vexdoc::GridFault(spectrum); !fault.empty()) {
+        throw Measure::MeasureException(fault, "");
+      }
+      return spectrum.GetData();
     });
   }
   return table.ToPython();
@@ -182,13 +200,7 @@ FloatArray ToArray(const std::vector<float>& values) {
 }
 
 const std::vector<float>& SpectrumOf(const Sample& sample, const std::optional<std::string>& type) {
-  for (const auto& [name, attribute] : sample.GetElements()) {
-    const auto* const spectrum = dynamic_cast<const Vexdoc::Spectrum*>(attribute.Get());
-    if (spectrum != nullptr && (!type || TypeOf(*spectrum) == *type)) {
-      return spectrum->GetData();
-    }
-  }
-  throw ResourceNotAvailableException("the sample '" + sample.GetName() + "' has no spectrum", "");
+  return FindSpectrum(sample, type).GetData();
 }
 
 FloatArray ColorOf(const Sample& sample, const std::string& space, const py::object& illuminant,

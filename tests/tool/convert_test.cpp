@@ -196,8 +196,8 @@ TEST_F(ConvertTest, LegacyDocumentIsCompletedOrRefusedWithTheSample) {
       " --condition Colorimetric.Illumination=A --condition Physical.SpectrumType=Emission"
       " --condition Physical.WavelengthSpectrumMax=";
   ExpectRefused("a.xml old.xml" + given + "401nm",
-                "sample 'x', Spectrum 1: 3 values from '400nm' to '401nm' would get", 1);
-  ExpectRefused("a.xml old.xml" + given + "200nm", "would get equal or falling wavelengths", 1);
+                "3 points at 400, 500, 600 nm, but the conditions say from '400nm' to '401nm'", 1);
+  ExpectRefused("a.xml old.xml" + given + "200nm", "conditions say from '400nm' to '200nm'", 1);
   const Result result = Run("convert a.xml b.xml" + given + "600nm");
   EXPECT_EQ(result.status, 0);
   EXPECT_TRUE(Holds(result.err, "NumberOfDataPointsSpectrum set to 3, the number of values"));

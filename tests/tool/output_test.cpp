@@ -65,6 +65,63 @@ TEST_F(OutputTest, FailingOutputIsAnError) {
   EXPECT_TRUE(Holds(closed.err, "standard output cannot be written"));
 }
 
+TEST_F(OutputTest, NoInputIsReplacedByWhatIsNoDocument) {
+  WriteFile("a.csv", "Name\nx\n");
+  ASSERT_EQ(Shell("mkdir d; ln -s ../a.xml d/link; ln a.xml hard; cp a.xml lamp.xml; "
+                  "aldermoor cache --rebuild a.xml > /dev/null; cp a.xml before; "
+                  "cp Cache/a.vexb cache")
+                .status,
+            0);
+  const char* const cases[] = {
+      "color a.xml -o a.xml",
+      "color a.xml -o ./d/../a.xml",
+      "color a.xml -o d/link",
+      "color d/link -o a.xml",
+      "color a.xml -o hard",
+      "color a.xml -o Cache/a.vexb",
+      "color lamp.xml --illuminant @a.xml:Set/gray -o a.xml",
+      "color - -o a.xml < a.xml",
+      "color a.xml >> a.xml",
+      "color a.xml -o /dev/stdout >> a.xml",
+      "convert a.xml - >> a.xml",
+      "info a.xml -o a.xml",
+      "check a.xml -o a.xml",
+      "check lamp.xml Cache/a.vexb -o Cache/a.vexb",
+      "dump Cache/a.vexb -o Cache/a.vexb",
+      "diff a.xml lamp.xml -o a.xml",
+      "diff lamp.xml a.xml -o a.xml",
+      "density a.xml -o a.xml",
+      "light a.xml -o a.xml",
+      "classify a.xml -o a.xml",
+      "metamerism lamp.xml a.xml -o a.xml",
+      "spectrum --input a.xml -o a.xml",
+      "spectrum --input a.xml --save a.xml",
+  };
+  for (const char* const command : cases) {
+    const Result result = Run(command);
+    EXPECT_EQ(result.status, 2) << command << result.err;
+    EXPECT_TRUE(Holds(result.err, "would be written over the input ")) << command;
+    EXPECT_EQ(Shell("cmp before a.xml && cmp cache Cache/a.vexb").status, 0) << command;
+    EXPECT_EQ(Shell("test -L d/link && test a.xml -ef hard").status, 0) << command;
+  }
+  EXPECT_EQ(Run("spectrum 50,0,0 --save new -o d/../new").status, 2) << "two outputs in one";
+  EXPECT_EQ(Shell("ls | grep -c '\\.......$'").out, "0\n") << "no temporary file is left";
+}
+
+TEST_F(OutputTest, DocumentThatTakesThePlaceOfItsInputSaysSo) {
+  WriteFile("a.csv", "Name\nx\n");
+  for (const std::string command :
+       {"convert a.xml d/a.xml", "merge lamp.xml a.xml -o d/a.xml",
+        "extract a.xml --set Set -o d/a.xml", "convert a.csv d/../a.csv"}) {
+    ASSERT_EQ(Shell("mkdir -p d; ln -sf ../a.xml d/a.xml; cp a.xml lamp.xml").status, 0);
+    const Result result = Run(command);
+    EXPECT_EQ(result.status, 0) << command << result.err;
+    EXPECT_TRUE(Holds(result.err, ": the input is replaced\n")) << command;
+    EXPECT_EQ(Run("check a.xml").status, 0) << command;
+  }
+  EXPECT_FALSE(Holds(Run("convert a.xml new.xml").err, "replaced"));
+}
+
 TEST_F(OutputTest, ReaderThatWentAwayEndsTheRunQuietly) {
   const Result result = Shell("{ sleep 0.2; aldermoor color a.xml; echo $? > status; } | true");
   EXPECT_EQ(ReadFile("status"), "4\n");

@@ -1,6 +1,7 @@
 #ifndef ALDERMOOR_VEXDOC_INSPECTION_H
 #define ALDERMOOR_VEXDOC_INSPECTION_H
 
+#include <cstddef>
 #include <iosfwd>
 #include <string>
 #include <vector>
@@ -31,13 +32,24 @@ struct Fault {
   unsigned int column = 0;
   /// The place in a cache: the first byte of the field, counted from 0.  0 in a text.
   unsigned long long offset = 0;
+  /// What the document that is read from the file does not say, though the file does.
+  enum class Loss {
+    kNone,
+    kContent,
+    kWavelengths,  ///< Those of a spectrum, which are not those of its conditions; see LoadOptions.
+  };
+  Loss loss = Loss::kNone;
+  /// Further faults, elsewhere, that differ from this one in quoted texts and numbers only.  They
+  /// are not listed.
+  std::size_t repeats = 0;
 };
 
 /// The faults of a document in XML of either dialect, in the order of the text.
 ///
 /// A text without errors is one that VEX::LoadXML reads from the file itself; caches take no part.
-/// The check goes on behind a fault, but a text that is not well-formed, and one whose root is no
-/// document, have that fault alone.  The XML platform must be up.  Shared state: none.
+/// Of faults that are alike, the first ten are listed; the last of them has the number of the
+/// others. The check goes on behind a fault, but a text that is not well-formed, and one whose root
+/// is no document, have that fault alone.  The XML platform must be up.  Shared state: none.
 /// Throws: ResourceNotAvailableException with name and reason if the file cannot be read;
 /// VexException if the XML platform is not initialised.
 ALDERMOOR_EXPORT std::vector<Fault> CheckXML(const Utilities::FileSystem::File& file);

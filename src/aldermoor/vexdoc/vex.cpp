@@ -12,6 +12,7 @@
 #include "aldermoor/vexdoc/elementvisitor.h"
 #include "aldermoor/vexdoc/internals/binaryprovider.h"
 #include "aldermoor/vexdoc/internals/xercesadapter.h"
+#include "aldermoor/vexdoc/loadoptions.h"
 #include "aldermoor/vexdoc/vexexception.h"
 #include "aldermoor/vexdoc/vexnode.inl.h"
 
@@ -84,6 +85,28 @@ void RemoveQuietly(const File& file) {
   }
 }
 
+void LoadFromText(Internals::XMLParserAdapter& adapter, const File& file) {
+  try {
+    File xml(file.GetAbsoluteName());
+    adapter.Load(xml);
+  } catch (const VexException&) {
+    throw;
+  } catch (const std::exception& e) {
+    throw VexException(e.what(), ALDERMOOR_HERE(Aldermoor::Vexdoc::VEX::LoadXML));
+  }
+}
+
+// The document is loaded all the same if that fails.
+void UpdateCacheQuietly(const VEX& document, File& cache, const File& xml, const FileStamp& stamp) {
+  try {
+    xml.GetDirectory().CreateSubdir(kCacheDirectory);
+    GetBinaryProvider(document)->Write(cache);
+    DropCacheOfOldFile(cache, xml, stamp);
+  } catch (...) {
+    RemoveQuietly(cache);
+  }
+}
+
 void ApplyTypeCreator(File& file) {
   try {
     file.ApplyMacTypeCreator();
@@ -114,6 +137,15 @@ void VEX::Load(std::istream& in) try {
 }
 ALDERMOOR_FRAME(Aldermoor::Vexdoc::VEX::Load)
 
+LoadReport VEX::Load(std::istream& in, const LoadOptions& options) try {
+  LoadReport report;
+  Internals::XercesAdapter adapter(this);
+  adapter.SetOptions(options, report);
+  adapter.Load(in);
+  return report;
+}
+ALDERMOOR_FRAME(Aldermoor::Vexdoc::VEX::Load)
+
 void VEX::Store(std::ostream& out) const try { GetXMLParserAdapter(*this)->Store(out); }
 ALDERMOOR_FRAME(Aldermoor::Vexdoc::VEX::Store)
 
@@ -123,24 +155,35 @@ void VEX::LoadXML(const File& file, bool updateCache) try {
     return;
   }
   const FileStamp stamp = StampOf(file);
-  try {
-    File xml(file.GetAbsoluteName());
-    GetXMLParserAdapter(*this)->Load(xml);
-  } catch (const VexException&) {
-    throw;
-  } catch (const std::exception& e) {
-    throw VexException(e.what(), ALDERMOOR_HERE(Aldermoor::Vexdoc::VEX::LoadXML));
+  LoadFromText(*GetXMLParserAdapter(*this), file);
+  if (updateCache) {
+    UpdateCacheQuietly(*this, cache, file, stamp);
   }
-  if (!updateCache) {
-    return;
+}
+ALDERMOOR_FRAME(Aldermoor::Vexdoc::VEX::LoadXML)
+
+LoadReport VEX::LoadXML(const File& file, const LoadOptions& options) try {
+  LoadReport report;
+  File cache = GetCacheFile(file);
+  const bool reads_cache =
+      options.cache != CacheUse::kNone && options.wavelengths != WavelengthUse::kComplete;
+  if (reads_cache && LoadFromCache(*this, cache, file)) {
+    report.from_cache = true;
+    if (options.completion) {
+      report.completion = CompleteConditions(*this, *options.completion);
+    }
+    return report;
   }
-  try {
-    file.GetDirectory().CreateSubdir(kCacheDirectory);
-    GetBinaryProvider(*this)->Write(cache);
-    DropCacheOfOldFile(cache, file, stamp);
-  } catch (...) {
-    RemoveQuietly(cache);  // the document is loaded all the same
+  report.cache_reason = reads_cache ? "there is no good one" : "it was not asked for";
+  const FileStamp stamp = StampOf(file);
+  Internals::XercesAdapter adapter(this);
+  adapter.SetOptions(options, report);
+  LoadFromText(adapter, file);
+  // A cache answers for the file, not for what was added to its document.
+  if (options.cache == CacheUse::kReadAndWrite && adapter.WasExact() && !report.HasCompleted()) {
+    UpdateCacheQuietly(*this, cache, file, stamp);
   }
+  return report;
 }
 ALDERMOOR_FRAME(Aldermoor::Vexdoc::VEX::LoadXML)
 

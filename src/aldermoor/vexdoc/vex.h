@@ -12,6 +12,9 @@
 
 namespace Aldermoor::Vexdoc {
 
+struct LoadOptions;
+struct LoadReport;
+
 extern template class ALDERMOOR_EXPORT VexNode<SampleSet, UniqueStoragePolicy<SampleSet>>;
 
 /// The look-up and the streams of a document, as a layer of its own.
@@ -64,6 +67,13 @@ class ALDERMOOR_EXPORT VEX
   /// Throws: VexXMLParseException with file, line and column if the text is not well-formed;
   /// VexParseException and VexException if its content breaks a rule or the file cannot be read.
   void LoadXML(const Utilities::FileSystem::File& file, bool updateCache);
+  /// The same two, but with nothing in the document that the text does not say: elements for which
+  /// it has no dates have none, and spectra whose wavelengths are not those of their conditions are
+  /// refused, completed or told as `options` ask (loadoptions.h).  On failure, the document stays
+  /// as it was with both. Throws: WavelengthException with sets, samples and wavelengths; what the
+  /// plain ones throw.
+  LoadReport Load(std::istream& in, const LoadOptions& options);
+  LoadReport LoadXML(const Utilities::FileSystem::File& file, const LoadOptions& options);
   /// Writes this document to `file` as Store does, and with `updateCache` to its cache.
   ///
   /// Files are replaced as a whole: on failure the old file is still there.  The process locale is

@@ -26,6 +26,13 @@ class ALDERMOOR_EXPORT VexParseException : public VexException {
   using VexException::VexException;
 };
 
+/// The wavelengths of spectra in a document are not those of their conditions.  The text names set,
+/// sample, points and conditions, a line each.
+class ALDERMOOR_EXPORT WavelengthException : public VexParseException {
+ public:
+  using VexParseException::VexParseException;
+};
+
 /// The text of a document is not well-formed XML.
 class ALDERMOOR_EXPORT VexXMLParseException : public VexParseException {
  public:

@@ -92,7 +92,8 @@ TEST(XmlCheckTest, EveryFaultIsToldAtItsElement) {
 <Value>1</Value><Value Name='1nm'>9e99</Value></Spectrum></SampleAttribute><SampleAttribute>
 <ColorVector Conditions='2'><Value Name='a'/></ColorVector></SampleAttribute></Sample></SampleSet>
 )",
-       R"(1:199 warning: the conditions of a spectrum lack the mandatory 'Physical.WavelengthSpectrumMax'
+       R"(1:1 warning: a comment is not kept
+1:199 warning: the conditions of a spectrum lack the mandatory 'Physical.WavelengthSpectrumMax'
 2:11 warning: there is a sample set '' already; only the first one is found by that name
 2:11 error: 'SampleSet' has no 'Name'
 3:57 warning: there is a sample 'b' already; only the first one is found by that name
@@ -119,6 +120,7 @@ TEST(XmlCheckTest, EveryFaultIsToldAtItsElement) {
        R"(2:1 error: the conditions have no 'ID'
 2:14 warning: conditions '2' are declared again; the last ones count
 2:36 warning: 'A' is not read: it names no condition
+2:40 warning: a comment is not kept
 2:40 warning: the text of 'A' is read up to the first element, comment or CDATA section only
 3:1 warning: the condition 'k' is given again; the last one counts
 3:11 error: the illumination has 0 different wavelengths instead of 36
@@ -128,6 +130,67 @@ TEST(XmlCheckTest, EveryFaultIsToldAtItsElement) {
   for (const auto& [content, told] : cases) {
     EXPECT_EQ(Told(&CheckXML, kDocument + content + "</VEX>"), told) << content;
   }
+}
+
+TEST(XmlCheckTest, WhatNoDocumentHoldsIsALoss) {
+  // Each is put into the sample of an otherwise good document.
+  const std::string cases[][2] = {
+      {"<!-- -->", "a comment is not kept"},
+      {"<?x y?>", "the processing instruction 'x' is not kept"},
+      {"text", "the text in 'Sample' is not read"},
+      {"<![CDATA[text]]>", "the text in 'Sample' is not read"},
+      {"<Creator><![CDATA[me]]></Creator>",
+       "the text of 'Creator' is read up to the first element, comment or CDATA section only"},
+      {"<Creator lang='de'>me</Creator>", "the attribute 'lang' of 'Creator' is not read"},
+      {"<AdditionalData><Value Name='a' Unit='b'/></AdditionalData>",
+       "of the attributes of 'Value' only 'Name' is kept"},
+      {"<SampleAttribute><Recipe Conditions='1' Date='x'/></SampleAttribute>",
+       "the attribute 'Date' of 'Recipe' is not read"},
+      {"<SampleAttribute><Gloss Conditions='1' Zone='x'/></SampleAttribute>",
+       "of the attributes of 'Gloss' only 'Conditions' is kept"},
+      {"<SampleAttribute><Gloss Angle='60' Conditions='1'/></SampleAttribute>", ""},
+      {"<SampleAttribute><Gloss Conditions='1'>\n x<A/></Gloss></SampleAttribute>",
+       "the text of 'Gloss' begins with a line feed and is read as empty"},
+      {"<SampleAttribute><Spectrum Conditions='1'><Value Name='380.5'>1</Value></Spectrum>"
+       "</SampleAttribute>",
+       "the wavelength '380.5' is read as 380"},
+  };
+  for (const auto& [content, told] : cases) {
+    std::istringstream in("<VEX Version='1.0'><Name/><SampleSet><Name/><Sample><Name/>" + content +
+                          kDocument.substr(kDocument.find("<SampleAttribute>")) + "</VEX>");
+    std::string losses;
+    for (const Fault& fault : CheckXML(in)) {
+      losses += fault.loss == Fault::Loss::kContent ? fault.text : "";
+    }
+    EXPECT_EQ(losses, told) << content;
+  }
+}
+
+TEST(XmlCheckTest, WavelengthsOtherThanThoseOfTheConditionsAreToldBesideTheErrors) {
+  const auto told = [](const char* point) {
+    std::string text = kDocument;
+    text.insert(text.find("</Sample>"), "<SampleAttribute><Spectrum Conditions='1'><Value Name='" +
+                                            std::string(point) +
+                                            "'>1</Value></Spectrum></SampleAttribute>");
+    return Told(&CheckXML, text + "</VEX>");
+  };
+  EXPECT_EQ(told("380").find("points at"), std::string::npos);
+  EXPECT_NE(told("390").find("warning: 1 point at 390 nm, but the conditions say from '380' to 730 "
+                             "(not named)"),
+            std::string::npos)
+      << told("390");
+}
+
+TEST(XmlCheckTest, FaultsThatAreAlikeAreCounted) {
+  std::string text = "<VEX Version='1'><Name/>";
+  for (int i = 0; i < 1000; ++i) {
+    text += "<SampleSet><Name>" + std::to_string(i / 2) + "</Name></SampleSet>";
+  }
+  std::istringstream in(text + "</VEX>");
+  const std::vector<Fault> faults = CheckXML(in);
+  ASSERT_EQ(faults.size(), 10U);
+  EXPECT_EQ(faults.front().repeats, 0U);
+  EXPECT_EQ(faults.back().repeats, 490U);
 }
 
 TEST(XmlCheckTest, CheckLeavesNoConditionsBehind) {

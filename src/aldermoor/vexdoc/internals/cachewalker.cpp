@@ -48,11 +48,9 @@ std::vector<Fault> CacheWalker::Walk(const Visit& visit) try {
     WalkFile();
   } catch (const End& end) {
     end_ = end.fault;
-    faults_.push_back(end.fault);
+    faults_.Add(end.fault);
   }
-  std::stable_sort(faults_.begin(), faults_.end(),
-                   [](const Fault& a, const Fault& b) { return a.offset < b.offset; });
-  return std::move(faults_);
+  return faults_.Take();
 }
 ALDERMOOR_FRAME(Aldermoor::Vexdoc::Internals::CacheWalker::Walk)
 
@@ -328,7 +326,7 @@ void CacheWalker::Field(CacheField::Kind kind, const char* label, std::size_t si
 }
 
 void CacheWalker::Add(Fault::Severity severity, std::size_t offset, const std::string& text) {
-  faults_.push_back({severity, text, 0, 0, offset});
+  faults_.Add({severity, text, 0, 0, offset});
 }
 
 void CacheWalker::Error(std::size_t offset, const std::string& text) {

@@ -13,6 +13,7 @@
 
 #include "aldermoor/vexdoc/conditions.h"
 #include "aldermoor/vexdoc/inspection.h"
+#include "aldermoor/vexdoc/internals/faultlist.h"
 
 namespace Aldermoor::Vexdoc::Internals {
 
@@ -99,7 +100,7 @@ class CacheWalker {
   const Visit* visit_ = nullptr;
   std::vector<Attribute> attributes_;
   std::map<std::string_view, Block> blocks_;
-  std::vector<Fault> faults_;
+  FaultList faults_;
   std::optional<Fault> end_;
 };
 

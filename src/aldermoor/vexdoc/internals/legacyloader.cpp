@@ -24,7 +24,7 @@ void Complete(Conditions& conditions, const char* key, const std::string& value)
 }  // namespace
 
 void LegacyLoader::LoadMembers(Spectrum& spectrum) try {
-  const std::vector<float> data = ReadSpectrumValues();
+  const std::vector<float> data = ReadSpectrumValues(spectrum);
   Conditions conditions(*spectrum.GetConditions());
   Complete(conditions, ConditionKeys::kWavelengthMin, kUndefined);
   Complete(conditions, ConditionKeys::kWavelengthMax, kUndefined);

@@ -84,6 +84,8 @@ void XercesAdapter::Load(std::istream& in) try {
     FailInternally(kInternalFailure, e.getMessage());
   } catch (const xercesc::DOMException& e) {
     FailInternally(kInternalFailure, e.getMessage());
+  } catch (const WavelengthException&) {
+    throw;
   } catch (const VexXMLParseException& e) {
     // Still a VexException to who asks for one, but with the place of the fault.
     throw VexXMLParseException(StreamFailure(e), e.GetFile(), e.GetLine(), e.GetColumn(),
@@ -157,6 +159,11 @@ SmartPointer<XMLLoader> XercesAdapter::GetLoader(xercesc::DOMDocument* document)
 }
 ALDERMOOR_FRAME(Aldermoor::Vexdoc::Internals::XercesAdapter::GetLoader)
 
+void XercesAdapter::SetOptions(const LoadOptions& options, LoadReport& report) {
+  options_ = &options;
+  report_ = &report;
+}
+
 void XercesAdapter::LoadFrom(const std::vector<char>& bytes, const std::string& name) {
   const xercesc::MemBufInputSource source(reinterpret_cast<const XMLByte*>(bytes.data()),
                                           bytes.size(), XMLChBuffer(name).Get(), false,
@@ -180,7 +187,16 @@ void XercesAdapter::LoadFrom(const std::vector<char>& bytes, const std::string& 
                                 std::to_string(bytes.size()) + " bytes may take",
                             ALDERMOOR_HERE(Aldermoor::Vexdoc::Internals::XercesAdapter::Load));
   }
-  const SmartPointer<VEX> loaded = GetLoader(parser.getDocument())->Load();
+  const SmartPointer<XMLLoader> loader = GetLoader(parser.getDocument());
+  if (options_ != nullptr) {
+    loader->SetRules({.gives_dates = false,
+                      .takes_any_count = options_->wavelengths == WavelengthUse::kComplete});
+  }
+  const SmartPointer<VEX> loaded = loader->Load();
+  was_exact_ = loader->GetNotes().IsExact(*loaded);
+  if (options_ != nullptr) {
+    loader->GetNotes().Settle(*loaded, *options_, *report_);
+  }
   DocumentAccess::Swap(*document_, *loaded);
 }
 

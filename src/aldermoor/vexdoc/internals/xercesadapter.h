@@ -41,6 +41,13 @@ class XercesAdapter : public XMLParserAdapter {
   /// Throws: ResourceNotAvailableException for a file that cannot be written.
   Platform::Posix::FileStamp Store(Utilities::FileSystem::File& file) override;
 
+  /// Makes loads follow `options` and fill `report`; both outlive this object.  They throw
+  /// WavelengthException then, and give no dates that the text does not hold.
+  void SetOptions(const LoadOptions& options, LoadReport& report);
+  /// Whether the document of the last load said what its text says, before it was completed; see
+  /// LoadNotes.
+  bool WasExact() const { return was_exact_; }
+
   /// The loader for the dialect of a parsed document, which its root's "Version" tells.
   static Utilities::Tools::SmartPointer<XMLLoader> GetLoader(xercesc::DOMDocument* document);
 
@@ -49,6 +56,9 @@ class XercesAdapter : public XMLParserAdapter {
   void LoadFrom(const std::vector<char>& bytes, const std::string& name);
 
   VEX* document_;
+  const LoadOptions* options_ = nullptr;
+  LoadReport* report_ = nullptr;
+  bool was_exact_ = false;
 };
 
 }  // namespace Aldermoor::Vexdoc::Internals

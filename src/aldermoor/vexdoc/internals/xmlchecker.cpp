@@ -3,7 +3,6 @@
 #include <algorithm>
 #include <iterator>
 #include <stdexcept>
-#include <tuple>
 #include <utility>
 
 #include <xercesc/dom/DOMDocument.hpp>
@@ -15,10 +14,13 @@
 #include <xercesc/util/XMLString.hpp>
 
 #include "aldermoor/utilities/exceptions/frame.h"
+#include "aldermoor/vexdoc/conditionkeys.h"
 #include "aldermoor/vexdoc/internals/attributerules.h"
+#include "aldermoor/vexdoc/internals/customillumination.h"
 #include "aldermoor/vexdoc/internals/faulttext.h"
 #include "aldermoor/vexdoc/internals/parsebudget.h"
 #include "aldermoor/vexdoc/internals/xerceshelper.h"
+#include "aldermoor/vexdoc/internals/xmllosses.h"
 #include "aldermoor/vexdoc/internals/xmlnames.h"
 #include "aldermoor/vexdoc/vexexception.h"
 
@@ -49,10 +51,6 @@ std::string ParseReason(const std::string& message) {
   return message.substr(message.find('\n') + 1);
 }
 
-bool IsBlank(const XMLCh* text) {
-  return std::all_of(text, text + XMLString::stringLen(text), [](XMLCh c) { return c <= u' '; });
-}
-
 }  // namespace
 
 std::vector<Fault> XMLChecker::Check(std::string_view bytes) try {
@@ -60,20 +58,16 @@ std::vector<Fault> XMLChecker::Check(std::string_view bytes) try {
   try {
     CheckText(bytes);
   } catch (const VexXMLParseException& e) {
-    faults_.push_back(
-        {Fault::Severity::kError, ParseReason(e.what()), e.GetLine(), e.GetColumn(), 0});
+    faults_.Add({Fault::Severity::kError, ParseReason(e.what()), e.GetLine(), e.GetColumn(), 0});
   } catch (const xercesc::OutOfMemoryException&) {
-    faults_.push_back({Fault::Severity::kError,
-                       "the document takes more memory than a text of its size may take", 0, 0, 0});
+    faults_.Add({Fault::Severity::kError,
+                 "the document takes more memory than a text of its size may take", 0, 0, 0});
   } catch (const xercesc::XMLException& e) {
-    faults_.push_back({Fault::Severity::kError, ToNativeString(e.getMessage()), 0, 0, 0});
+    faults_.Add({Fault::Severity::kError, ToNativeString(e.getMessage()), 0, 0, 0});
   } catch (const xercesc::DOMException& e) {  // for a version "1.2" in the declaration
-    faults_.push_back({Fault::Severity::kError, ToNativeString(e.getMessage()), 0, 0, 0});
+    faults_.Add({Fault::Severity::kError, ToNativeString(e.getMessage()), 0, 0, 0});
   }
-  std::stable_sort(faults_.begin(), faults_.end(), [](const Fault& a, const Fault& b) {
-    return std::tie(a.line, a.column) < std::tie(b.line, b.column);
-  });
-  return std::move(faults_);
+  return faults_.Take();
 }
 ALDERMOOR_FRAME(Aldermoor::Vexdoc::Internals::XMLChecker::Check)
 
@@ -91,6 +85,9 @@ void XMLChecker::CheckText(std::string_view bytes) {
     parser.parse(source);
   }
   parser_ = &parser;
+  FindRemarks(*parser.getDocument(), [this](const NodeHolder& holder, const std::string& text) {
+    WarnOfLoss(holder, text);
+  });
   CheckDocument(NodeHolder(parser.getDocument()));
   parser_ = nullptr;
 }
@@ -103,6 +100,7 @@ void XMLChecker::CheckDocument(const NodeHolder& document) {
   }
   const XMLCh* const version = root.AttributeValue(kVersion);
   is_legacy_ = version == nullptr || *version == 0;
+  CheckContainer(root, kVersion);
   ForEachElement(root, kConditions, [this](const NodeHolder& block) { CheckBlock(block); });
   CheckHeader(root, true, {kSampleSet, kConditions});
   std::set<std::string> names;
@@ -112,13 +110,14 @@ void XMLChecker::CheckDocument(const NodeHolder& document) {
   });
   for (const auto& [id, block] : blocks_) {
     if (!block.is_used) {
-      Warn(block.holder,
-           "no attribute links to the conditions " + Quoted(id) + "; a save drops them");
+      WarnOfLoss(block.holder,
+                 "no attribute links to the conditions " + Quoted(id) + "; a save drops them");
     }
   }
 }
 
 void XMLChecker::CheckBlock(const NodeHolder& block) {
+  CheckContainer(block);
   Conditions conditions;
   ForEachElement(block, kAnyElement, [&](const NodeHolder& child) {
     const DOMNode* const key = child.FirstAttribute();
@@ -126,46 +125,58 @@ void XMLChecker::CheckBlock(const NodeHolder& block) {
       return;
     }
     if (key == nullptr || *key->getNodeValue() == 0) {
-      return Warn(child, Quoted(child.GetName()) + " is not read: it names no condition");
+      return WarnOfLoss(child, Quoted(child.GetName()) + " is not read: it names no condition");
     }
-    CheckRun(child);
+    CheckLeaf(child, true);
     const std::string name = ToNativeString(key->getNodeValue());
     if (conditions.HasAttribute(name)) {
-      Warn(child, "the condition " + Quoted(name) + " is given again; the last one counts");
+      WarnOfLoss(child, "the condition " + Quoted(name) + " is given again; the last one counts");
     }
-    conditions.AddAttribute(name, child.GetText());
+    const std::string value = child.GetText();
+    if ((name == ConditionKeys::kWavelengthMin || name == ConditionKeys::kWavelengthMax) &&
+        IsWavelengthMisread(value)) {
+      WarnOfLoss(child, "the wavelength " + Quoted(value) + " is read as " +
+                            std::to_string(*ReadWavelength(value)));
+    }
+    conditions.AddAttribute(name, value);
   });
   const NodeHolder id = block.FindChild(kId, false);
   if (id.IsNull()) {
     return Error(block, "the conditions have no 'ID'");
   }
-  CheckRun(id);
-  CheckIllumination(block, id);
+  CheckLeaf(id, false);
+  CheckIllumination(block, id, conditions);
   const std::string text = id.GetText();
   if (blocks_.contains(text)) {
-    Warn(block, "conditions " + Quoted(text) + " are declared again; the last ones count");
+    WarnOfLoss(block, "conditions " + Quoted(text) + " are declared again; the last ones count");
   }
   blocks_.insert_or_assign(text, Block{std::move(conditions), block});
 }
 
-void XMLChecker::CheckIllumination(const NodeHolder& block, const NodeHolder& id) {
+void XMLChecker::CheckIllumination(const NodeHolder& block, const NodeHolder& id,
+                                   const Conditions& conditions) {
   const NodeHolder spectrum = id.NextSibling(kSpectrum, false);
   ForEachElement(block, kSpectrum, [&](const NodeHolder& other) {
     if (spectrum.IsNull() || &other.GetXMLNode() != &spectrum.GetXMLNode()) {
-      Warn(other, "'Spectrum' is not read: only the first one behind the 'ID' is");
+      WarnOfLoss(other, "'Spectrum' is not read: only the first one behind the 'ID' is");
     }
   });
   if (spectrum.IsNull()) {
     return;
   }
+  CheckContainer(spectrum, kConditions);
   const auto points = CheckPoints(spectrum);
-  if (points && *points != kIlluminationPoints) {
-    Error(spectrum, "the illumination has " + Counted(*points, "different wavelength") +
+  if (points && points->size() != kIlluminationPoints) {
+    Error(spectrum, "the illumination has " + Counted(points->size(), "different wavelength") +
                         " instead of " + std::to_string(kIlluminationPoints));
+  } else if (points && !AreOfIllumination(*points, conditions)) {
+    Add(Fault::Severity::kWarning, spectrum,
+        ContradictionText(*points, CustomIlluminationConditions()), Fault::Loss::kWavelengths);
   }
 }
 
 void XMLChecker::CheckSampleSet(const NodeHolder& set) {
+  CheckContainer(set);
   CheckHeader(set, true, {kSample});
   std::set<std::string> names;
   ForEachElement(set, kSample, [this, &names](const NodeHolder& sample) {
@@ -175,19 +186,21 @@ void XMLChecker::CheckSampleSet(const NodeHolder& set) {
 }
 
 void XMLChecker::CheckSample(const NodeHolder& sample) {
+  CheckContainer(sample);
   CheckHeader(sample, true, {kSampleAttribute});
   ForEachElement(sample, kSampleAttribute,
                  [this](const NodeHolder& wrapper) { CheckAttribute(wrapper); });
 }
 
 void XMLChecker::CheckAttribute(const NodeHolder& wrapper) {
+  CheckContainer(wrapper);
   const NodeHolder typed = wrapper.FindChild(kAnyElement, false);
   if (typed.IsNull()) {
     return Error(wrapper, "'SampleAttribute' holds no element");
   }
   if (const NodeHolder other = typed.NextSibling(kAnyElement, false); !other.IsNull()) {
-    Warn(other, Quoted(other.GetName()) +
-                    " is not read: only the first element of a 'SampleAttribute' is");
+    WarnOfLoss(other, Quoted(other.GetName()) +
+                          " is not read: only the first element of a 'SampleAttribute' is");
   }
   const std::string kind = ElementKind(typed.GetName());
   if (IsLevel(kind)) {
@@ -204,21 +217,29 @@ void XMLChecker::CheckMembers(const std::string& kind, const NodeHolder& typed, 
   } else if (kind == "Recipe") {
     CheckRecipe(typed);
   } else {
-    CheckDataTree(typed);
+    CheckDataTree(typed, true);
   }
 }
 
 void XMLChecker::CheckSpectrum(const NodeHolder& spectrum, Block* block) {
+  CheckContainer(spectrum, kConditions);
   CheckHeader(spectrum, false, {kValue});
   const auto points = CheckPoints(spectrum);
-  if (block == nullptr || is_legacy_) {
+  if (block == nullptr) {
+    return;
+  }
+  if (points && !AreOfConditions(*points, block->conditions)) {
+    Add(Fault::Severity::kWarning, spectrum, ContradictionText(*points, block->conditions),
+        Fault::Loss::kWavelengths);
+  }
+  if (is_legacy_) {
     return;  // legacy spectra have as many points as they have, under whatever conditions
   }
   const auto expected = ExpectedPoints(block->conditions);
   if (!expected) {
     Error(spectrum, "the number of points in its conditions is no number");
-  } else if (points && *points != *expected) {
-    Error(spectrum, Counted(*points, "different wavelength") + " instead of the " +
+  } else if (points && points->size() != *expected) {
+    Error(spectrum, Counted(points->size(), "different wavelength") + " instead of the " +
                         std::to_string(*expected) + " of its conditions");
   }
   if (!std::exchange(block->is_told, true)) {
@@ -229,15 +250,16 @@ void XMLChecker::CheckSpectrum(const NodeHolder& spectrum, Block* block) {
 }
 
 void XMLChecker::CheckColor(const NodeHolder& color, const Block* block) {
+  CheckContainer(color, kConditions);
   CheckHeader(color, false, {kValue});
   std::size_t channels = 0;
   ForEachElement(color, kValue, [this, &channels](const NodeHolder& value) {
     const DOMNode* const attribute = value.FirstAttribute();
     if (attribute == nullptr || !XMLString::equals(attribute->getNodeName(), kName)) {
-      return Warn(value, "'Value' is not read: its first attribute is not 'Name'");
+      return WarnOfLoss(value, "'Value' is not read: its first attribute is not 'Name'");
     }
     ++channels;
-    CheckNumber(value);
+    CheckNumber(value, true);
   });
   if (block == nullptr) {
     return;
@@ -249,28 +271,41 @@ void XMLChecker::CheckColor(const NodeHolder& color, const Block* block) {
 }
 
 void XMLChecker::CheckRecipe(const NodeHolder& recipe) {
+  CheckContainer(recipe, kConditions);
   CheckHeader(recipe, false, {kAssortmentName, kThickness, kSubstrateLinkName, kComponents});
   if (const NodeHolder thickness = recipe.FindChild(kThickness, false); !thickness.IsNull()) {
-    CheckNumber(thickness);
+    CheckNumber(thickness, false);
+  }
+  for (const XMLCh* const name : {kAssortmentName, kSubstrateLinkName}) {
+    if (const NodeHolder text = recipe.FindChild(name, false); !text.IsNull()) {
+      CheckLeaf(text, false);
+    }
   }
   const NodeHolder list = recipe.FindChild(kComponents, false);
   if (list.IsNull()) {
     return;
   }
+  CheckContainer(list);
   ForEachElement(list, kAnyElement, [this](const NodeHolder& component) {
     if (component.FirstAttribute() == nullptr) {
-      Warn(component, "the component is not read: it has no name");
+      WarnOfLoss(component, "the component is not read: it has no name");
     } else {
-      CheckNumber(component);
+      CheckNumber(component, true);
     }
   });
 }
 
 // Recursion is bounded by the depth that the parser lets through.
-void XMLChecker::CheckDataTree(const NodeHolder& node) {
-  CheckSingleAttribute(node);
-  CheckRun(node);
-  ForEachElement(node, kAnyElement, [this](const NodeHolder& child) { CheckDataTree(child); });
+void XMLChecker::CheckDataTree(const NodeHolder& node, bool is_root) {
+  WarnOfLoss(node, LostRuns(node));
+  WarnOfLoss(node, LostFurtherAttributes(node, is_root ? kConditions : nullptr));
+  if (const std::string text = node.GetText();
+      text.starts_with('\n') && text.find_first_not_of(" \t\r\n") != std::string::npos) {
+    WarnOfLoss(node, "the text of " + Quoted(node.GetName()) +
+                         " begins with a line feed and is read as empty");
+  }
+  ForEachElement(node, kAnyElement,
+                 [this](const NodeHolder& child) { CheckDataTree(child, false); });
 }
 
 void XMLChecker::CheckHeader(const NodeHolder& holder, bool is_name_mandatory,
@@ -281,23 +316,24 @@ void XMLChecker::CheckHeader(const NodeHolder& holder, bool is_name_mandatory,
     const auto key = std::find_if(std::begin(kHeaderKeys), std::end(kHeaderKeys),
                                   [&](const auto& k) { return child.IsElement(k.element); });
     if (key != std::end(kHeaderKeys)) {
-      CheckRun(child);
+      CheckLeaf(child, false);
       if (!seen.insert(key->element).second) {
-        Warn(child, Quoted(key->key) + " is given again; the first one counts");
+        WarnOfLoss(child, Quoted(key->key) + " is given again; the first one counts");
       }
     } else if (child.IsElement(kAdditionalData)) {
       if (std::exchange(has_additional_data, true)) {
-        Warn(child, "'AdditionalData' is given again; the first one counts");
+        WarnOfLoss(child, "'AdditionalData' is given again; the first one counts");
       }
+      CheckContainer(child);
       ForEachElement(child, kAnyElement, [this](const NodeHolder& value) {
-        CheckRun(value);
+        CheckLeaf(value, true);
         if (value.FirstAttribute() == nullptr) {
-          Warn(value, Quoted(value.GetName()) + " is not read: it has no key");
+          WarnOfLoss(value, Quoted(value.GetName()) + " is not read: it has no key");
         }
       });
     } else if (std::none_of(others.begin(), others.end(),
                             [&](const XMLCh* name) { return child.IsElement(name); })) {
-      Warn(child, Quoted(child.GetName()) + " is not read here");
+      WarnOfLoss(child, Quoted(child.GetName()) + " is not read here");
     }
   });
   if (is_name_mandatory && !seen.contains(kName)) {
@@ -330,67 +366,62 @@ XMLChecker::Block* XMLChecker::CheckLink(const NodeHolder& typed) {
   return &block->second;
 }
 
-std::optional<std::size_t> XMLChecker::CheckPoints(const NodeHolder& spectrum) {
+std::optional<Wavelengths> XMLChecker::CheckPoints(const NodeHolder& spectrum) {
   std::set<unsigned int> wavelengths;
   bool are_numbers = true;
-  ForEachElement(spectrum, kValue, [&](const NodeHolder& value) {
-    const DOMNode* const attribute = value.FirstAttribute();
-    if (attribute == nullptr || !XMLString::equals(attribute->getNodeName(), kName)) {
-      return Warn(value, "'Value' is not read: its first attribute is not 'Name'");
-    }
-    CheckNumber(value);
-    const std::string text = ToNativeString(attribute->getNodeValue());
-    try {
-      const unsigned int wavelength = ReadUnsigned(attribute->getNodeValue());
-      if (text.find_first_not_of("0123456789") != std::string::npos) {
-        Warn(value, "the wavelength " + Quoted(text) + " is read as " + std::to_string(wavelength));
-      }
-      if (!wavelengths.insert(wavelength).second) {
-        Warn(value, "the wavelength " + std::to_string(wavelength) +
-                        " is given again; the first one counts");
-      }
-    } catch (const std::invalid_argument&) {
-      are_numbers = false;
-      Error(value, "the wavelength " + Quoted(text) + " is no number");
-    }
-  });
-  return are_numbers ? std::make_optional(wavelengths.size()) : std::nullopt;
+  ForEachElement(spectrum, kValue,
+                 [&](const NodeHolder& value) { CheckValue(value, wavelengths, are_numbers); });
+  return are_numbers ? std::make_optional(Wavelengths(wavelengths.begin(), wavelengths.end()))
+                     : std::nullopt;
 }
 
-void XMLChecker::CheckNumber(const NodeHolder& holder) {
-  CheckRun(holder);
+void XMLChecker::CheckValue(const NodeHolder& value, std::set<unsigned int>& wavelengths,
+                            bool& are_numbers) {
+  const DOMNode* const attribute = value.FirstAttribute();
+  if (attribute == nullptr || !XMLString::equals(attribute->getNodeName(), kName)) {
+    return WarnOfLoss(value, "'Value' is not read: its first attribute is not 'Name'");
+  }
+  CheckNumber(value, true);
+  const std::string text = ToNativeString(attribute->getNodeValue());
+  try {
+    const unsigned int wavelength = ReadUnsigned(attribute->getNodeValue());
+    if (text.find_first_not_of("0123456789") != std::string::npos) {
+      const bool is_other = IsWavelengthMisread(text) || text.find('-') != std::string::npos;
+      Add(Fault::Severity::kWarning, value,
+          "the wavelength " + Quoted(text) + " is read as " + std::to_string(wavelength),
+          is_other ? Fault::Loss::kContent : Fault::Loss::kNone);
+    }
+    if (!wavelengths.insert(wavelength).second) {
+      WarnOfLoss(value, "the wavelength " + std::to_string(wavelength) +
+                            " is given again; the first one counts");
+    }
+  } catch (const std::invalid_argument&) {
+    are_numbers = false;
+    Error(value, "the wavelength " + Quoted(text) + " is no number");
+  }
+}
+
+void XMLChecker::CheckLeaf(const NodeHolder& holder, bool is_named) {
+  WarnOfLoss(holder, LostRuns(holder));
+  WarnOfLoss(holder, is_named ? LostFurtherAttributes(holder) : LostAttributes(holder, nullptr));
+}
+
+void XMLChecker::CheckNumber(const NodeHolder& holder, bool is_named) {
+  CheckLeaf(holder, is_named);
   if (const std::string fault = NumberFault(holder.GetText()); !fault.empty()) {
-    Warn(holder, fault + "; it is read as " + NumberText(holder.GetFloat()));
+    WarnOfLoss(holder, fault + "; it is read as " + NumberText(holder.GetFloat()));
   }
 }
 
-void XMLChecker::CheckRun(const NodeHolder& holder) {
-  bool is_first = true;
-  for (const DOMNode* child = holder.GetXMLNode().getFirstChild(); child != nullptr;
-       child = child->getNextSibling()) {
-    const bool is_text = child->getNodeType() == DOMNode::TEXT_NODE;
-    if (is_text && std::exchange(is_first, false)) {
-      continue;
-    }
-    if ((is_text || child->getNodeType() == DOMNode::CDATA_SECTION_NODE) &&
-        !IsBlank(child->getNodeValue())) {
-      return Warn(holder, "the text of " + Quoted(holder.GetName()) +
-                              " is read up to the first element, comment or CDATA section only");
-    }
-  }
+void XMLChecker::CheckContainer(const NodeHolder& holder, const XMLCh* attribute) {
+  WarnOfLoss(holder, LostText(holder));
+  WarnOfLoss(holder, LostAttributes(holder, attribute));
 }
 
-void XMLChecker::CheckSingleAttribute(const NodeHolder& holder) {
-  const xercesc::DOMNamedNodeMap* const attributes = holder.GetXMLNode().getAttributes();
-  if (attributes->getLength() > 1) {
-    Warn(holder, "of the attributes of " + Quoted(holder.GetName()) + " only " +
-                     Quoted(ToNativeString(attributes->item(0)->getNodeName())) + " is kept");
-  }
-}
-
-void XMLChecker::Add(Fault::Severity severity, const NodeHolder& holder, const std::string& text) {
+void XMLChecker::Add(Fault::Severity severity, const NodeHolder& holder, const std::string& text,
+                     Fault::Loss loss) {
   const Place place = parser_->GetPlace(holder.GetXMLNode());
-  faults_.push_back({severity, text, place.line, place.column, 0});
+  faults_.Add({severity, text, place.line, place.column, 0, loss});
 }
 
 void XMLChecker::Error(const NodeHolder& holder, const std::string& text) {
@@ -399,6 +430,12 @@ void XMLChecker::Error(const NodeHolder& holder, const std::string& text) {
 
 void XMLChecker::Warn(const NodeHolder& holder, const std::string& text) {
   Add(Fault::Severity::kWarning, holder, text);
+}
+
+void XMLChecker::WarnOfLoss(const NodeHolder& holder, const std::string& text) {
+  if (!text.empty()) {
+    Add(Fault::Severity::kWarning, holder, text, Fault::Loss::kContent);
+  }
 }
 
 }  // namespace Aldermoor::Vexdoc::Internals

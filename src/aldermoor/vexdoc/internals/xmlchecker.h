@@ -11,8 +11,10 @@
 
 #include "aldermoor/vexdoc/conditions.h"
 #include "aldermoor/vexdoc/inspection.h"
+#include "aldermoor/vexdoc/internals/faultlist.h"
 #include "aldermoor/vexdoc/internals/nodeholder.h"
 #include "aldermoor/vexdoc/internals/placedparser.h"
+#include "aldermoor/vexdoc/internals/wavelengths.h"
 
 namespace Aldermoor::Vexdoc::Internals {
 
@@ -36,7 +38,8 @@ class XMLChecker {
   void CheckText(std::string_view bytes);
   void CheckDocument(const NodeHolder& document);
   void CheckBlock(const NodeHolder& block);
-  void CheckIllumination(const NodeHolder& block, const NodeHolder& id);
+  void CheckIllumination(const NodeHolder& block, const NodeHolder& id,
+                         const Conditions& conditions);
   void CheckSampleSet(const NodeHolder& set);
   void CheckSample(const NodeHolder& sample);
   void CheckAttribute(const NodeHolder& wrapper);
@@ -45,7 +48,8 @@ class XMLChecker {
   void CheckSpectrum(const NodeHolder& spectrum, Block* block);
   void CheckColor(const NodeHolder& color, const Block* block);
   void CheckRecipe(const NodeHolder& recipe);
-  void CheckDataTree(const NodeHolder& node);
+  // The root has a link to conditions, which is kept whatever other attribute is.
+  void CheckDataTree(const NodeHolder& node, bool is_root);
 
   // The header elements, and that there are no children but those and the `others`.
   void CheckHeader(const NodeHolder& holder, bool is_name_mandatory, ElementNames others);
@@ -53,21 +57,27 @@ class XMLChecker {
   void CheckIsFirst(const NodeHolder& element, const char* noun, std::set<std::string>& names);
   // The block to which an attribute links; null after a fault.
   Block* CheckLink(const NodeHolder& typed);
-  // How many different wavelengths there are; none after an error among them.
-  std::optional<std::size_t> CheckPoints(const NodeHolder& spectrum);
-  void CheckNumber(const NodeHolder& holder);
-  // That nothing stands behind the first run of text, which is all that is read.
-  void CheckRun(const NodeHolder& holder);
-  void CheckSingleAttribute(const NodeHolder& holder);
+  // The different wavelengths; none after an error among them.
+  std::optional<Wavelengths> CheckPoints(const NodeHolder& spectrum);
+  void CheckValue(const NodeHolder& value, std::set<unsigned int>& wavelengths, bool& are_numbers);
+  // That an element with text holds nothing that is not read; `is_named` if it has a name or key
+  // in its first attribute.
+  void CheckLeaf(const NodeHolder& holder, bool is_named);
+  void CheckNumber(const NodeHolder& holder, bool is_named);
+  // That an element of elements holds no text, and no attribute but `attribute`.
+  void CheckContainer(const NodeHolder& holder, const XMLCh* attribute = nullptr);
 
-  void Add(Fault::Severity severity, const NodeHolder& holder, const std::string& text);
+  void Add(Fault::Severity severity, const NodeHolder& holder, const std::string& text,
+           Fault::Loss loss = Fault::Loss::kNone);
   void Error(const NodeHolder& holder, const std::string& text);
   void Warn(const NodeHolder& holder, const std::string& text);
+  // Warns of something that is in no document; an empty text tells nothing.
+  void WarnOfLoss(const NodeHolder& holder, const std::string& text);
 
   const PlacedParser* parser_ = nullptr;
   bool is_legacy_ = false;
   std::map<std::string, Block> blocks_;  // by the ID in the file
-  std::vector<Fault> faults_;
+  FaultList faults_;
 };
 
 }  // namespace Aldermoor::Vexdoc::Internals

@@ -58,8 +58,13 @@ void ForEachValue(const NodeHolder& parent, Visit visit) {
   }
 }
 
-// The values of a spectrum in ascending order of wavelength; of equal wavelengths the first counts.
-std::vector<float> ValuesByWavelength(const NodeHolder& holder) {
+struct Points {
+  Wavelengths wavelengths;
+  std::vector<float> values;
+};
+
+// The points of a spectrum in ascending order of wavelength; of equal wavelengths the first counts.
+Points PointsByWavelength(const NodeHolder& holder) {
   std::vector<std::pair<unsigned int, float>> points;
   ForEachValue(holder, [&points](const XMLCh* wavelength, const NodeHolder& value) {
     points.emplace_back(ReadUnsigned(wavelength), value.GetFloat());
@@ -74,10 +79,14 @@ std::vector<float> ValuesByWavelength(const NodeHolder& holder) {
     return a.first == b.first;
   };
   points.erase(std::unique(points.begin(), points.end(), same_wavelength), points.end());
-  std::vector<float> values(points.size());
-  std::transform(points.begin(), points.end(), values.begin(),
-                 [](const auto& point) { return point.second; });
-  return values;
+  Points sorted;
+  sorted.wavelengths.reserve(points.size());
+  sorted.values.reserve(points.size());
+  for (const auto& [wavelength, value] : points) {
+    sorted.wavelengths.push_back(wavelength);
+    sorted.values.push_back(value);
+  }
+  return sorted;
 }
 
 }  // namespace
@@ -176,8 +185,12 @@ void XMLLoader::HeaderParser(NodeHolder& holder, Header& header, bool isSampleAt
     holder.FindChild(kName, true);  // raises the failure
   }
   for (std::size_t i = 0; i < found.size(); ++i) {
+    const std::string key = kHeaderKeys[i].key;
     if (found[i] != nullptr) {
-      header.SetAttribute(kHeaderKeys[i].key, NodeHolder(found[i]).GetText());
+      header.SetAttribute(key, NodeHolder(found[i]).GetText());
+    } else if (key == Header::kCreatedKey || key == Header::kModifiedKey) {
+      // The constructor has put in the present.
+      rules_.gives_dates ? notes_.AddGivenDate() : header.RemoveAttribute(key);
     }
   }
   if (additional_data != nullptr) {
@@ -200,7 +213,7 @@ void XMLLoader::ConditionParser(NodeHolder& block) try {
   if (NodeHolder spectrum = id.NextSibling(kSpectrum, false); !spectrum.IsNull()) {
     const Conditions own = CustomIlluminationConditions();
     std::vector<float> data;
-    SpectrumVectorParser(spectrum, own, data);
+    notes_.AddIllumination(id.GetText(), SpectrumVectorParser(spectrum, own, data), conditions);
     conditions.SetCustomIllumination(Spectrum(own, data));
   }
   condition_links_[id.GetText()] =
@@ -208,22 +221,25 @@ void XMLLoader::ConditionParser(NodeHolder& block) try {
 }
 ALDERMOOR_FRAME(Aldermoor::Vexdoc::Internals::XMLLoader::ConditionParser)
 
-void XMLLoader::SpectrumVectorParser(NodeHolder& holder, const Conditions& conditions,
-                                     std::vector<float>& out) try {
+Wavelengths XMLLoader::SpectrumVectorParser(NodeHolder& holder, const Conditions& conditions,
+                                            std::vector<float>& out) try {
   const auto expected = Utilities::Tools::lexical_cast<unsigned int>(
       conditions.GetAttribute(ConditionKeys::kPointCount, "36"));
-  std::vector<float> values = ValuesByWavelength(holder);
-  if (values.size() != expected) {
+  Points points = PointsByWavelength(holder);
+  if (points.values.size() != expected && !(rules_.takes_any_count && !points.values.empty())) {
     throw VexParseException(
         "Missing Spectrum elements in XML",
         ALDERMOOR_HERE(Aldermoor::Vexdoc::Internals::XMLLoader::SpectrumVectorParser));
   }
-  out.swap(values);
+  out.swap(points.values);
+  return std::move(points.wavelengths);
 }
 ALDERMOOR_FRAME(Aldermoor::Vexdoc::Internals::XMLLoader::SpectrumVectorParser)
 
-std::vector<float> XMLLoader::ReadSpectrumValues() const {
-  return ValuesByWavelength(current_);
+std::vector<float> XMLLoader::ReadSpectrumValues(const Spectrum& spectrum) {
+  Points points = PointsByWavelength(current_);
+  notes_.AddSpectrum(spectrum, std::move(points.wavelengths));
+  return std::move(points.values);
 }
 
 std::vector<std::pair<std::string, float>> XMLLoader::ReadChannels() const {
@@ -235,7 +251,8 @@ std::vector<std::pair<std::string, float>> XMLLoader::ReadChannels() const {
 }
 
 void XMLLoader::LoadMembers(Spectrum& spectrum) try {
-  SpectrumVectorParser(current_, *spectrum.GetConditions(), DocumentAccess::Data(spectrum));
+  notes_.AddSpectrum(spectrum, SpectrumVectorParser(current_, *spectrum.GetConditions(),
+                                                    DocumentAccess::Data(spectrum)));
 }
 ALDERMOOR_FRAME(Aldermoor::Vexdoc::Internals::XMLLoader::LoadMembers)
 

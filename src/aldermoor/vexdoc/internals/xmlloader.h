@@ -9,6 +9,7 @@
 #include "aldermoor/utilities/tools/smartpointer.h"
 #include "aldermoor/vexdoc/dataitem.h"
 #include "aldermoor/vexdoc/elementvisitor.h"
+#include "aldermoor/vexdoc/internals/loadnotes.h"
 #include "aldermoor/vexdoc/internals/nodeholder.h"
 #include "aldermoor/vexdoc/vex.h"
 
@@ -26,7 +27,11 @@ class XMLLoader : public ElementVisitor {
   /// `document` stands on the DOM document node.
   explicit XMLLoader(NodeHolder document);
 
+  /// Without it, the rules are those of a plain load.
+  void SetRules(const LoadRules& rules) { rules_ = rules; }
   Utilities::Tools::SmartPointer<VEX> Load();
+  /// What the load noticed.
+  const LoadNotes& GetNotes() const { return notes_; }
 
   void VisitVex(VEX& vex) override;
   void VisitSampleSet(SampleSet& set) override;
@@ -45,14 +50,14 @@ class XMLLoader : public ElementVisitor {
   virtual void LoadMembers(ColorVector& vector);
   virtual void LoadMembers(Spectrum& spectrum);
 
-  /// The values of the "Value" children in ascending order of wavelength; of equal wavelengths the
-  /// first counts.
-  void SpectrumVectorParser(NodeHolder& holder, const Conditions& conditions,
-                            std::vector<float>& out);
+  /// The values of the "Value" children in ascending order of wavelength, and those; of equal
+  /// wavelengths the first counts.
+  Wavelengths SpectrumVectorParser(NodeHolder& holder, const Conditions& conditions,
+                                   std::vector<float>& out);
   Utilities::Tools::SmartPointer<DataTree> VEXDataTreeParser(const NodeHolder& holder);
 
-  /// The same of the current node, however many there are.
-  std::vector<float> ReadSpectrumValues() const;
+  /// The values of `spectrum`, which is the current node, however many there are.
+  std::vector<float> ReadSpectrumValues(const Spectrum& spectrum);
   /// Label and value of the "Value" children of the current node, in the order of the file.
   std::vector<std::pair<std::string, float>> ReadChannels() const;
 
@@ -62,6 +67,8 @@ class XMLLoader : public ElementVisitor {
   template <class Attribute>
   void LoadSampleAttribute(Attribute& attribute);
 
+  LoadRules rules_;
+  LoadNotes notes_;
   std::map<std::string, std::string> condition_links_;  // ID in the file to ID in the manager
   NodeHolder current_;
 };
