@@ -37,6 +37,9 @@ struct Findings {
     is_cache = file.ends_with(".vexb") || bytes.starts_with(kCacheHead);
     std::istringstream in(std::move(bytes));
     faults = is_cache ? Vexdoc::CheckCache(in) : Vexdoc::CheckXML(in);
+    if (!is_cache && file != kStandardStream) {
+      cache = Vexdoc::StateOfCache(Utilities::FileSystem::File(file));
+    }
     for (const Fault& fault : faults) {
       ++(fault.severity == Fault::Severity::kError ? errors : warnings);
     }
@@ -44,6 +47,7 @@ struct Findings {
 
   std::string path;
   bool is_cache = false;
+  Vexdoc::CacheState cache;  // of an XML file
   std::vector<Fault> faults;
   std::size_t errors = 0;
   std::size_t warnings = 0;
@@ -68,8 +72,11 @@ std::string ToText(const Findings& findings) {
                        fault.severity == Fault::Severity::kWarning ? "warning: " : "",
                        OnOneLine(fault.text));
   }
+  if (findings.cache.exists && !findings.cache.is_used) {
+    out += fmt::format("{}: the cache is not used: {}\n", path, OnOneLine(findings.cache.reason));
+  }
   if (findings.faults.empty()) {
-    return fmt::format("{}: in order\n", path);
+    return out + fmt::format("{}: in order\n", path);
   }
   return out + fmt::format("{}: {} fault{}, {} warning{}\n", path, findings.errors,
                            findings.errors == 1 ? "" : "s", findings.warnings,
@@ -88,11 +95,15 @@ ordered_json ToJson(const Findings& findings) {
     }
     faults.push_back(std::move(item));
   }
-  return {{"file", findings.path},
-          {"kind", findings.is_cache ? "cache" : "xml"},
-          {"errors", findings.errors},
-          {"warnings", findings.warnings},
-          {"faults", faults}};
+  ordered_json result = {{"file", findings.path},
+                         {"kind", findings.is_cache ? "cache" : "xml"},
+                         {"errors", findings.errors},
+                         {"warnings", findings.warnings},
+                         {"faults", faults}};
+  if (findings.cache.exists) {
+    result["cache"] = {{"used", findings.cache.is_used}, {"reason", findings.cache.reason}};
+  }
+  return result;
 }
 
 class CheckCommand : public Command {

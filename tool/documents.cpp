@@ -34,6 +34,11 @@ void CheckIsFile(const std::string& path) {
   }
 }
 
+bool& IgnoresCaches() {
+  static bool ignores = false;
+  return ignores;
+}
+
 // Messages of the library may be of several lines, each one the reason of the line above.
 std::string Reason(const std::exception& e) {
   std::string text;
@@ -58,13 +63,19 @@ void LoadDocument(const std::string& path, Vexdoc::VEX& document) {
       document.Load(in);
     } else {
       CheckIsFile(path);
-      document.LoadXML(Utilities::FileSystem::File(path), false);
+      Vexdoc::LoadOptions options;
+      options.cache = IgnoresCaches() ? Vexdoc::CacheUse::kNone : Vexdoc::CacheUse::kRead;
+      document.LoadXML(Utilities::FileSystem::File(path), options);
     }
   } catch (const Vexdoc::VexXMLParseException& e) {
     throw InputError(fmt::format("{}:{}:{}: {}", shown, e.GetLine(), e.GetColumn(), Reason(e)));
   } catch (const std::exception& e) {
     throw InputError(fmt::format("{}: {}", shown, Reason(e)));
   }
+}
+
+void AddNoCacheFlag(CLI::App& app) {
+  AddFlag(app, "--no-cache", IgnoresCaches(), "Read XML files themselves, not their caches");
 }
 
 void InputOptions::AddTo(CLI::App& app) {

@@ -16,9 +16,14 @@ class App;
 
 namespace Aldermoor::Tool {
 
-/// Reads a document, from standard input for "-".
+/// Reads a document, from standard input for "-", and from the cache beside the file unless
+/// "--no-cache" was given.
 /// Throws: InputError with the place of the fault in front, as far as it is known.
 void LoadDocument(const std::string& path, Vexdoc::VEX& document);
+
+/// The option "--no-cache" of the commands that read with LoadDocument.  Shared state: what it says
+/// holds for the whole run of the program.
+void AddNoCacheFlag(CLI::App& app);
 
 /// The argument "FILE...".
 struct InputOptions {

@@ -81,13 +81,20 @@ int ErrorOfWriting(std::string_view text) {
   return 0;
 }
 
-Owner<VEX> Load(const py::object& given, bool cache) {
+Owner<VEX> Load(const py::object& given, bool cache, bool no_cache) {
+  if (cache && no_cache) {
+    throw py::value_error("cache and no_cache: one of them at most");
+  }
+  Vexdoc::LoadOptions options;
+  options.cache = no_cache ? Vexdoc::CacheUse::kNone
+                  : cache  ? Vexdoc::CacheUse::kReadAndWrite
+                           : Vexdoc::CacheUse::kRead;
   const Path path(given);
   const LibraryLock lock;
   const SmartPointer<VEX> document(new VEX);
   try {
     const LibraryAlone library;
-    document->LoadXML(File(path.bytes), cache);
+    document->LoadXML(File(path.bytes), options);
   } catch (const Vexdoc::VexException& e) {
     if (const int error = ErrorOfReading(path.bytes)) {
       ThrowFileError(error, path.name, &e);
@@ -399,14 +406,15 @@ void AddDocuments(py::module_& module) {
   AddSampleClass(module);
   AddSetClass(module);
   AddDocumentClass(module);
-  module.def("load", &Load, R"(load(path, cache=False)
+  module.def("load", &Load, R"(load(path, cache=False, *, no_cache=False)
 --
 
-The document in an XML file, or in the cache beside it if that is newer.
+The document in an XML file, or in the cache beside it if that is newer and of this very file: the
+same either way.
 
-With `cache`, that is written after the XML was read.
+With `cache`, that is written after the XML was read; with `no_cache`, it is not looked at.
 Raises FileError, or ParseError with the place where the file is no document.)",
-             arg("path"), arg("cache") = false);
+             arg("path"), arg("cache") = false, py::kw_only(), arg("no_cache") = false);
   module.def("loads", &Loads, "loads(text)\n--\n\nThe document in XML, as `dumps` gives it.",
              arg("text"));
 }
