@@ -72,11 +72,8 @@ std::string ToText(const Findings& findings) {
                        fault.severity == Fault::Severity::kWarning ? "warning: " : "",
                        OnOneLine(fault.text));
   }
-  if (findings.cache.exists && !findings.cache.is_used) {
-    out += fmt::format("{}: the cache is not used: {}\n", path, OnOneLine(findings.cache.reason));
-  }
   if (findings.faults.empty()) {
-    return out + fmt::format("{}: in order\n", path);
+    return fmt::format("{}: in order\n", path);
   }
   return out + fmt::format("{}: {} fault{}, {} warning{}\n", path, findings.errors,
                            findings.errors == 1 ? "" : "s", findings.warnings,
@@ -124,6 +121,10 @@ class CheckCommand : public Command {
       try {
         const Findings findings(path);
         has_results = true;
+        // No fault of the document, which is read all the same.
+        if (findings.cache.exists && !findings.cache.is_used) {
+          Report(fmt::format("{}: the cache is not used: {}", path, findings.cache.reason));
+        }
         if (json) {
           results.push_back(ToJson(findings));
         } else {
