@@ -53,8 +53,8 @@ constexpr CommandEntry kCommands[] = {
      "  aldermoor density chart.xml --paper Strip/paper --first Strip/C100 \\\n"
      "      --second Strip/M100 --overprint Strip/CM\n",
      &MakeDensityCommand, true},
-    {"light", "Judge spectra as those of lamps", "  aldermoor light lamps.xml\n",
-     &MakeLightCommand, true},
+    {"light", "Judge spectra as those of lamps", "  aldermoor light lamps.xml\n", &MakeLightCommand,
+     true},
     {"classify", "Name the colour family of every sample", "  aldermoor classify chart.xml\n",
      &MakeClassifyCommand, true},
     {"metamerism", "Tell how far pairs of samples drift apart under other lights",

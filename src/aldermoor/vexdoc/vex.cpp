@@ -38,8 +38,7 @@ SmartPointer<Internals::BinaryProvider> GetBinaryProvider(const VEX& document) {
 
 // Why the document did not come from the cache; empty if it did.  Whatever is wrong with a cache,
 // the XML file is there.
-std::string LoadFromCache(VEX& document, const XmlCache& cache, XmlCache::Need need,
-                          CacheUse use) {
+std::string LoadFromCache(VEX& document, const XmlCache& cache, XmlCache::Need need, CacheUse use) {
   XmlCache::Found found;
   try {
     found = cache.Find(need);

@@ -31,8 +31,8 @@ void SetDate(const fs::path& path, const fs::path& reference, int seconds) {
   fs::last_write_time(path, fs::last_write_time(reference) + std::chrono::seconds(seconds));
 }
 
-// An XML file and a cache with documents of other names, so that it shows which was read.  The cache
-// has no stamp, which would tell them apart.
+// An XML file and a cache with documents of other names, so that it shows which was read.  The
+// cache has no stamp, which would tell them apart.
 class CacheTest : public ::testing::Test {
  protected:
   CacheTest() {

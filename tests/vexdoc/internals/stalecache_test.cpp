@@ -50,7 +50,10 @@ void Create(const fs::path& from, const fs::path& to) {
 
 const Way kWays[] = {
     {"cp -p", Create},
-    {"mv", [](const fs::path& from, const fs::path& to) { fs::rename(from, to); }},
+    {"mv",
+     [](const fs::path& from, const fs::path& to) {
+       fs::rename(from, to);
+     }},
     {"tar x",
      [](const fs::path& from, const fs::path& to) {
        fs::remove(to);
@@ -111,10 +114,18 @@ LoadReport LoadPlainly(VEX& document, const File& file, bool update) {
 }
 
 const Reader kReaders[] = {
-    {"plain", [](VEX& document, const File& file) { return LoadPlainly(document, file, false); }},
-    {"updating", [](VEX& document, const File& file) { return LoadPlainly(document, file, true); }},
+    {"plain",
+     [](VEX& document, const File& file) {
+       return LoadPlainly(document, file, false);
+     }},
+    {"updating",
+     [](VEX& document, const File& file) {
+       return LoadPlainly(document, file, true);
+     }},
     {"reading",
-     [](VEX& document, const File& file) { return document.LoadXML(file, LoadOptions{}); }},
+     [](VEX& document, const File& file) {
+       return document.LoadXML(file, LoadOptions{});
+     }},
     {"writing",
      [](VEX& document, const File& file) {
        return document.LoadXML(file, LoadOptions{CacheUse::kReadAndWrite});
@@ -311,8 +322,8 @@ TEST_F(StaleCacheTest, ASavedDocumentIsTheSameFromCacheAndXml) {
                                    {"WavelengthSpectrumMax", "380nm"}}) {
     conditions.AddAttribute(std::string("Physical.") + key, value);
   }
-  sample.AddSampleAttribute(Utilities::Tools::SmartPointer<SampleAttribute>(
-      new Spectrum(conditions, {0.123456789F})));
+  sample.AddSampleAttribute(
+      Utilities::Tools::SmartPointer<SampleAttribute>(new Spectrum(conditions, {0.123456789F})));
   document.AddSample("set", sample);
   File file(xml_.string());
   document.SaveXML(file, true);
@@ -328,11 +339,26 @@ TEST_F(StaleCacheTest, ASavedDocumentIsTheSameFromCacheAndXml) {
 TEST_F(StaleCacheTest, LinksPipesAndFoldersInThePlaceOfACacheAreReplacedOrPassedOver) {
   const fs::path victim = directory_ / "victim";
   const std::map<std::string, std::function<void(const fs::path&)>> things = {
-      {"link", [&](const fs::path& path) { fs::create_symlink(victim, path); }},
-      {"hard link", [&](const fs::path& path) { fs::create_hard_link(victim, path); }},
-      {"dangling link", [&](const fs::path& path) { fs::create_symlink("none", path); }},
-      {"pipe", [&](const fs::path& path) { ASSERT_EQ(::mkfifo(path.c_str(), 0600), 0); }},
-      {"folder", [&](const fs::path& path) { fs::create_directories(path / "a"); }},
+      {"link",
+       [&](const fs::path& path) {
+         fs::create_symlink(victim, path);
+       }},
+      {"hard link",
+       [&](const fs::path& path) {
+         fs::create_hard_link(victim, path);
+       }},
+      {"dangling link",
+       [&](const fs::path& path) {
+         fs::create_symlink("none", path);
+       }},
+      {"pipe",
+       [&](const fs::path& path) {
+         ASSERT_EQ(::mkfifo(path.c_str(), 0600), 0);
+       }},
+      {"folder",
+       [&](const fs::path& path) {
+         fs::create_directories(path / "a");
+       }},
   };
   for (const char* file : {"Cache/paper.vexb", "Cache/paper.vexb.stamp"}) {
     for (const auto& [name, make] : things) {

@@ -71,8 +71,8 @@ class BinaryLoader : public ElementVisitor {
   const char* Take(std::size_t count);
 
   std::map<std::string, std::string> condition_links_;  // ID in the file to ID in the manager
-  std::string owned_;            // of a stream
-  std::string_view bytes_left_;  // of the file
+  std::string owned_;                                   // of a stream
+  std::string_view bytes_left_;                         // of the file
   unsigned int tree_depth_ = 0;
   // Colours in the order of the file, whose constructor needs the real conditions.
   std::vector<std::pair<ColorVector*, Channels>> pending_colors_;

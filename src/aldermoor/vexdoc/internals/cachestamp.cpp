@@ -51,8 +51,7 @@ bool Take(std::string_view& text, std::string_view name, Number& value, int base
     return false;
   }
   text.remove_prefix(1 + name.size());
-  const auto [end, error] =
-      std::from_chars(text.data(), text.data() + text.size(), value, base);
+  const auto [end, error] = std::from_chars(text.data(), text.data() + text.size(), value, base);
   text.remove_prefix(static_cast<std::size_t>(end - text.data()));
   return error == std::errc();
 }
@@ -78,8 +77,8 @@ std::int64_t XmlReading::Now() {
 
 bool XmlReading::IsSettled() const {
   const bool is_coarse = HasWholeSeconds(state.modified) && HasWholeSeconds(state.changed);
-  return std::max(state.modified, state.changed) +
-             (is_coarse ? kCoarseResolution : kResolution) < verified;
+  return std::max(state.modified, state.changed) + (is_coarse ? kCoarseResolution : kResolution) <
+         verified;
 }
 
 std::string CacheStamp::ToText() const try {
@@ -109,15 +108,14 @@ std::optional<CacheStamp> CacheStamp::FromText(std::string_view text) try {
   text.remove_prefix(std::string_view(kHead).size());
   CacheStamp stamp;
   int exact = 0;
-  const bool is_read = Take(text, "xml-size=", stamp.xml.state.size) &&
-                       Take(text, "modified=", stamp.xml.state.modified) &&
-                       Take(text, "changed=", stamp.xml.state.changed) &&
-                       Take(text, "inode=", stamp.xml.state.inode) &&
-                       Take(text, "xml-hash=", stamp.xml.hash, kHexadecimal) &&
-                       Take(text, "verified=", stamp.xml.verified) &&
-                       Take(text, "cache-size=", stamp.cache.size) &&
-                       Take(text, "cache-hash=", stamp.cache.hash, kHexadecimal) &&
-                       Take(text, "exact=", exact);
+  const bool is_read =
+      Take(text, "xml-size=", stamp.xml.state.size) &&
+      Take(text, "modified=", stamp.xml.state.modified) &&
+      Take(text, "changed=", stamp.xml.state.changed) &&
+      Take(text, "inode=", stamp.xml.state.inode) &&
+      Take(text, "xml-hash=", stamp.xml.hash, kHexadecimal) &&
+      Take(text, "verified=", stamp.xml.verified) && Take(text, "cache-size=", stamp.cache.size) &&
+      Take(text, "cache-hash=", stamp.cache.hash, kHexadecimal) && Take(text, "exact=", exact);
   stamp.is_exact = exact == 1;
   return is_read && stamp.ToText() == whole ? std::optional(stamp) : std::nullopt;
 }

@@ -85,8 +85,10 @@ XmlCache::Found Unusable(std::string reason) {
 }  // namespace
 
 XmlCache::XmlCache(const File& xml) try
-    : xml_path_(xml.GetAbsolutePlatformName()), cache_(CacheName(xml)),
-      cache_path_(cache_.GetAbsolutePlatformName()), stamp_path_(cache_path_ + ".stamp") {}
+    : xml_path_(xml.GetAbsolutePlatformName()),
+      cache_(CacheName(xml)),
+      cache_path_(cache_.GetAbsolutePlatformName()),
+      stamp_path_(cache_path_ + ".stamp") {}
 ALDERMOOR_FRAME(Aldermoor::Vexdoc::Internals::XmlCache::XmlCache)
 
 XmlCache::Found XmlCache::Find(Need need) const try {

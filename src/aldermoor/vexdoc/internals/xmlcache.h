@@ -16,10 +16,10 @@ namespace Aldermoor::Vexdoc::Internals {
 /// The binary cache beside an XML file with its stamp: which of the two a load may take.
 ///
 /// "Cache/paper.vexb" and "Cache/paper.vexb.stamp" beside "paper.xml".  A cache counts if its date
-/// is later than that of the XML file, its bytes are those that its stamp names, and the XML file is
-/// the one that the stamp names: by size, times and inode where they settle it, else by its bytes.
-/// One without a stamp, by an older version of this library, counts if its date is later than
-/// everything that is known of the XML file.  docs/binaryformat.md tells the rules.
+/// is later than that of the XML file, its bytes are those that its stamp names, and the XML file
+/// is the one that the stamp names: by size, times and inode where they settle it, else by its
+/// bytes. One without a stamp, by an older version of this library, counts if its date is later
+/// than everything that is known of the XML file.  docs/binaryformat.md tells the rules.
 class XmlCache {
  public:
   /// What a load asks of a cache.

@@ -55,8 +55,10 @@ bool IsLackOfRights(int error) {
 }  // namespace
 
 FileReplacement::FileReplacement(const std::string& path) try
-    : name_(path), target_(FollowLinks(path)),
-      directory_name_(DirectoryOf(target_)), stream_(&buffer_) {
+    : name_(path),
+      target_(FollowLinks(path)),
+      directory_name_(DirectoryOf(target_)),
+      stream_(&buffer_) {
   struct stat old {};
   if (::stat(path.c_str(), &old) != 0) {
     if (errno != ENOENT) {
@@ -81,10 +83,13 @@ FileReplacement::FileReplacement(const std::string& path) try
 }
 ALDERMOOR_FRAME(Aldermoor::Platform::Posix::FileReplacement::FileReplacement)
 
-FileReplacement::FileReplacement(const std::string& path, const struct stat& owner,
-                                 Flush flush) try
-    : name_(path), target_(path), directory_name_(DirectoryOf(path)), flush_(flush),
-      belongs_to_another_(true), stream_(&buffer_) {
+FileReplacement::FileReplacement(const std::string& path, const struct stat& owner, Flush flush) try
+    : name_(path),
+      target_(path),
+      directory_name_(DirectoryOf(path)),
+      flush_(flush),
+      belongs_to_another_(true),
+      stream_(&buffer_) {
   // Closed to everybody else until the owner's permissions are there.
   OpenTemporary(S_IRUSR | S_IWUSR);
   CopyPermissions(owner);
@@ -247,7 +252,8 @@ void FileReplacement::Fail(int error) const {
 
 void FileReplacement::FailInPlace(int error) const {
   throw Utilities::Exceptions::ResourceNotAvailableException(
-      "file '" + name_ + "' could not be replaced as a whole, and writing it in place has failed, " +
+      "file '" + name_ +
+          "' could not be replaced as a whole, and writing it in place has failed, " +
           "so that it holds neither the old nor the new content: " +
           std::generic_category().message(error),
       ALDERMOOR_HERE(Aldermoor::Platform::Posix::FileReplacement));

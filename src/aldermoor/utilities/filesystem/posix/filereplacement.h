@@ -69,8 +69,8 @@ class FileReplacement {
   [[noreturn]] void Fail(int error) const;
   [[noreturn]] void FailInPlace(int error) const;
 
-  std::string name_;       // in messages
-  std::string target_;     // what the temporary is renamed to
+  std::string name_;    // in messages
+  std::string target_;  // what the temporary is renamed to
   std::string directory_name_;
   std::string temporary_;  // empty if there is none
   Flush flush_ = Flush::kYes;
