@@ -230,6 +230,8 @@ TEST_F(FaultsTest, AProcessThatEndsAtAnyFileOperationLeavesTheOldFileOrTheNew) {
       for (const std::string& leftover : CheckFiles()) {
         EXPECT_EQ(leftover, ".tmp");
       }
+      EXPECT_TRUE(!fs::exists(cache_) || ReadFile(cache_) == old_cache_ || fs::exists(stamp_))
+          << "a new cache without a stamp would count by its date";
       deaths += WIFSIGNALED(status) ? 1 : 0;
     }
   }
