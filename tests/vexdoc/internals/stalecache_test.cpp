@@ -509,6 +509,7 @@ TEST_F(StaleCacheTest, ASaveRemovesTemporaryFilesOfEndedProcessesThatAreOld) {
 TEST_F(StaleCacheTest, AFileWhoseNameStartsLikeADriveIsWrittenAndRead) {
   const fs::path before = fs::current_path();
   fs::current_path(directory_ / "");
+  EXPECT_EQ(File("1:2.xml").GetAbsoluteName(), (directory_ / "1:2.xml").string());
   for (const char* name : {"1:2.xml", "a:b.xml"}) {
     File file(name);
     EXPECT_NO_THROW(VEX("drive").SaveXML(file, true)) << name;
