@@ -29,6 +29,13 @@ namespace {
 namespace fs = std::filesystem;
 using Utilities::FileSystem::File;
 
+// As the path of the document is given, relative or not.
+std::string CachePath(const std::string& path, const Vexdoc::CacheState& state) {
+  const fs::path cache = state.path;
+  return (fs::path(path).parent_path() / cache.parent_path().filename() / cache.filename())
+      .string();
+}
+
 std::optional<struct stat> StatusOf(const std::string& path) {
   struct stat status {};
   return stat(path.c_str(), &status) == 0 ? std::optional(status) : std::nullopt;
@@ -45,40 +52,16 @@ struct stat StatusOfDocument(const std::string& path) {
   return *status;
 }
 
-// Why the next load will not use the cache of `path`; empty if it will.
-std::string WhyNotUsed(const std::string& path, const std::string& cache) {
-  const struct stat xml = StatusOfDocument(path);
-  const auto status = StatusOf(cache);
-  if (!status) {
-    return errno == ENOENT ? "absent" : std::generic_category().message(errno);
-  }
-  if (!S_ISREG(status->st_mode)) {
-    return "not a regular file";
-  }
-  if (!File(cache).IsAccessable(false)) {
-    return "it cannot be read";
-  }
-  if (status->st_mtim.tv_sec <= xml.st_mtim.tv_sec) {
-    return "not later than the document by whole seconds";
-  }
-  for (const Vexdoc::Fault& fault : Vexdoc::CheckCache(File(cache))) {
-    if (fault.severity == Vexdoc::Fault::Severity::kError) {
-      return fmt::format("broken at 0x{:08x}: {}", fault.offset, fault.text);
-    }
-  }
-  return "";
-}
-
 std::string Show(const std::string& path) {
-  const std::string cache = CachePath(path);
-  const std::string why_not = WhyNotUsed(path, cache);
-  const auto status = StatusOf(cache);
-  std::string text = fmt::format("{}: {}", path, cache);
+  StatusOfDocument(path);
+  const Vexdoc::CacheState state = Vexdoc::StateOfCache(File(path));
+  const auto status = StatusOf(state.path);
+  std::string text = fmt::format("{}: {}", path, CachePath(path, state));
   if (status) {
     text += fmt::format(", {} bytes, {}", status->st_size,
                         Utilities::Tools::DateTime(status->st_mtim.tv_sec).GetDateTime());
   }
-  return text + (why_not.empty() ? ": used" : ": not used: " + why_not);
+  return text + (state.is_used ? ": used" : ": not used: " + state.reason);
 }
 
 // A cache counts only if it is later than its document by whole seconds.
@@ -93,14 +76,22 @@ void WaitOutTheSecondOf(const std::string& path) {
   }
 }
 
-std::string Remove(const std::string& path) {
-  const std::string cache = CachePath(path);
+// Whether there was such a file.
+bool RemoveFile(const std::string& path) {
   std::error_code error;
-  const bool removed = fs::remove(cache, error);
+  const bool removed = fs::remove(path, error);
   if (error) {
-    throw OutputError(cache, error.value());
+    throw OutputError(path, error.value());
   }
-  return fmt::format("{}: {}{}", path, cache, removed ? ": removed" : ": absent");
+  return removed;
+}
+
+std::string Remove(const std::string& path) {
+  const Vexdoc::CacheState state = Vexdoc::StateOfCache(File(path));
+  // The stamp last: without one, a cache counts by its date alone.
+  const bool removed = RemoveFile(state.path);
+  RemoveFile(state.path + ".stamp");
+  return fmt::format("{}: {}{}", path, CachePath(path, state), removed ? ": removed" : ": absent");
 }
 
 std::string Rebuild(const std::string& path) {
@@ -112,9 +103,9 @@ std::string Rebuild(const std::string& path) {
   Vexdoc::LoadOptions options;
   options.cache = Vexdoc::CacheUse::kReadAndWrite;
   document.LoadXML(File(path), options);
-  const std::string why_not = WhyNotUsed(path, CachePath(path));
-  if (!why_not.empty()) {
-    throw std::runtime_error(fmt::format("{}: the cache is not used: {}", path, why_not));
+  const Vexdoc::CacheState state = Vexdoc::StateOfCache(File(path));
+  if (!state.is_used) {
+    throw std::runtime_error(fmt::format("{}: the cache is not used: {}", path, state.reason));
   }
   return Show(path);
 }

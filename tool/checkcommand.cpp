@@ -38,6 +38,9 @@ struct Findings {
     is_cache = file.ends_with(".vexb") || bytes.starts_with(kCacheHead);
     std::istringstream in(std::move(bytes));
     faults = is_cache ? Vexdoc::CheckCache(in) : Vexdoc::CheckXML(in);
+    if (!is_cache && file != kStandardStream) {
+      cache = Vexdoc::StateOfCache(Utilities::FileSystem::File(file));
+    }
     for (const Fault& fault : faults) {
       (fault.severity == Fault::Severity::kError ? errors : warnings) += 1 + fault.repeats;
     }
@@ -45,6 +48,7 @@ struct Findings {
 
   std::string path;
   bool is_cache = false;
+  Vexdoc::CacheState cache;  // of an XML file
   std::vector<Fault> faults;
   std::size_t errors = 0;
   std::size_t warnings = 0;
@@ -83,11 +87,15 @@ ordered_json ToJson(const Findings& findings) {
     }
     faults.push_back(std::move(item));
   }
-  return {{"file", findings.path},
-          {"kind", findings.is_cache ? "cache" : "xml"},
-          {"errors", findings.errors},
-          {"warnings", findings.warnings},
-          {"faults", faults}};
+  ordered_json result = {{"file", findings.path},
+                         {"kind", findings.is_cache ? "cache" : "xml"},
+                         {"errors", findings.errors},
+                         {"warnings", findings.warnings},
+                         {"faults", faults}};
+  if (findings.cache.exists) {
+    result["cache"] = {{"used", findings.cache.is_used}, {"reason", findings.cache.reason}};
+  }
+  return result;
 }
 
 class CheckCommand : public Command {
@@ -108,6 +116,10 @@ class CheckCommand : public Command {
       try {
         const Findings findings(path);
         has_results = true;
+        // No fault of the document, which is read all the same.
+        if (findings.cache.exists && !findings.cache.is_used) {
+          Report(fmt::format("{}: the cache is not used: {}", path, findings.cache.reason));
+        }
         if (json) {
           results.push_back(ToJson(findings));
         } else {

@@ -34,6 +34,11 @@ void CheckIsFile(const std::string& path) {
   }
 }
 
+bool& IgnoresCaches() {
+  static bool ignores = false;
+  return ignores;
+}
+
 // Messages of the library may be of several lines, each one the reason of the line above.
 std::string Reason(const std::exception& e) {
   std::string text;
@@ -70,6 +75,7 @@ Vexdoc::LoadReport LoadDocument(const std::string& path, Vexdoc::VEX& document,
                                 Vexdoc::WavelengthUse wavelengths) {
   Vexdoc::LoadOptions options;
   options.wavelengths = wavelengths;
+  options.cache = IgnoresCaches() ? Vexdoc::CacheUse::kNone : Vexdoc::CacheUse::kRead;
   const bool standard = path == kStandardStream;
   std::istringstream in(standard ? ReadBytes(path) : "");
   NoteInput(path);
@@ -84,6 +90,10 @@ Vexdoc::LoadReport LoadDocument(const std::string& path, Vexdoc::VEX& document,
   } catch (const RefusedError& e) {
     throw InputError(e.what());  // one of several inputs, of which the others may be good
   }
+}
+
+void AddNoCacheFlag(CLI::App& app) {
+  AddFlag(app, "--no-cache", IgnoresCaches(), "Read XML files themselves, not their caches");
 }
 
 void InputOptions::AddTo(CLI::App& app) {

@@ -25,10 +25,15 @@ namespace Aldermoor::Tool {
 Vexdoc::LoadReport TryLoad(const std::string& path,
                            const std::function<Vexdoc::LoadReport()>& load);
 
-/// Reads a document, from standard input for "-", and notes it as an input.
+/// Reads a document, from standard input for "-", and from the cache beside the file unless
+/// "--no-cache" was given, and notes it as an input.
 /// Throws: InputError, also for what TryLoad refuses.
 Vexdoc::LoadReport LoadDocument(const std::string& path, Vexdoc::VEX& document,
                                 Vexdoc::WavelengthUse wavelengths = Vexdoc::WavelengthUse::kRefuse);
+
+/// The option "--no-cache" of the commands that read with LoadDocument.  Shared state: what it says
+/// holds for the whole run of the program.
+void AddNoCacheFlag(CLI::App& app);
 
 /// The argument "FILE...".
 struct InputOptions {

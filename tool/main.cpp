@@ -16,6 +16,7 @@
 
 #include "command.h"
 #include "diagnostics.h"
+#include "documents.h"
 #include "output.h"
 
 namespace Aldermoor::Tool {
@@ -26,42 +27,43 @@ struct CommandEntry {
   const char* summary;
   const char* examples;
   std::unique_ptr<Command> (*make)();
+  bool reads_caches = false;
 };
 
 constexpr CommandEntry kCommands[] = {
     {"info", "Show what documents hold",
      "  aldermoor info chart.xml\n"
      "  aldermoor info --format json *.xml\n",
-     &MakeInfoCommand},
+     &MakeInfoCommand, true},
     {"color", "Compute the colour of every sample",
      "  aldermoor color chart.xml\n"
      "  aldermoor color chart.xml --space CIEXYZ --illuminant 6500K --observer TenDegree\n"
      "  aldermoor color chart.xml --illuminant @lamps.xml:Booth/daylight --format csv\n"
      "  aldermoor color chart.xml --set Ramp --sample \"Cyan 50\" --format json\n"
      "  aldermoor color - --format csv --output chart.csv < chart.xml\n",
-     &MakeColorCommand},
+     &MakeColorCommand, true},
     {"diff", "Compare the samples of documents with those of a reference",
      "  aldermoor diff reference.xml print.xml\n"
      "  aldermoor diff reference.xml run1.xml run2.xml --summary --limit 3\n"
      "  aldermoor diff reference.xml print.xml --formula CMC --weights 2,1 --format csv\n",
-     &MakeDiffCommand},
+     &MakeDiffCommand, true},
     {"density", "Compute densities, dot area, contrast and trapping",
      "  aldermoor density chart.xml --standard ANSIT --paper Strip/paper\n"
      "  aldermoor density chart.xml --paper Strip/paper --solid Strip/C100 --solid Strip/M100\n"
      "  aldermoor density chart.xml --paper Strip/paper --first Strip/C100 \\\n"
      "      --second Strip/M100 --overprint Strip/CM\n",
-     &MakeDensityCommand},
-    {"light", "Judge spectra as those of lamps", "  aldermoor light lamps.xml\n",
-     &MakeLightCommand},
+     &MakeDensityCommand, true},
+    {"light", "Judge spectra as those of lamps", "  aldermoor light lamps.xml\n", &MakeLightCommand,
+     true},
     {"classify", "Name the colour family of every sample", "  aldermoor classify chart.xml\n",
-     &MakeClassifyCommand},
+     &MakeClassifyCommand, true},
     {"metamerism", "Tell how far pairs of samples drift apart under other lights",
      "  aldermoor metamerism original.xml copy.xml --reference D65 --test A,F11\n",
-     &MakeMetamerismCommand},
+     &MakeMetamerismCommand, true},
     {"spectrum", "Find reflectance spectra for given colours",
      "  aldermoor spectrum 50,20,10 --illuminant D65\n"
      "  aldermoor spectrum --input colours.xml --save spectra.xml\n",
-     &MakeSpectrumCommand},
+     &MakeSpectrumCommand, true},
     {"convert", "Turn XML into CSV, CSV into XML, or either into its own form anew",
      "  aldermoor convert legacy.xml new.xml --condition Colorimetric.Observer=TwoDegree\n"
      "  aldermoor convert chart.csv chart.xml --percent --set Chart\n"
@@ -120,6 +122,9 @@ Commands AddCommands(CLI::App& app) {
     subcommand->footer(fmt::format("Examples:\n{}\n{}", entry.examples, kExitStatusText));
     std::unique_ptr<Command> command = entry.make();
     command->AddOptions(*subcommand);
+    if (entry.reads_caches) {
+      AddNoCacheFlag(*subcommand);
+    }
     commands.emplace_back(subcommand, std::move(command));
   }
   return commands;

@@ -5,7 +5,9 @@
 #include <filesystem>
 #include <sstream>
 
+#include <fcntl.h>
 #include <fmt/format.h>
+#include <unistd.h>
 
 #include "aldermoor/utilities/exceptions/exceptions.h"
 #include "aldermoor/utilities/filesystem/file.h"
@@ -69,6 +71,20 @@ std::string CheckedText(const Vexdoc::VEX& document, const std::string& shown, b
   return out.str();
 }
 
+// Not beside a device, nor in a folder that takes no more files; the XML file is saved all the
+// same.
+bool HasPlaceForCache(const std::string& path) {
+  namespace fs = std::filesystem;
+  const fs::path file = path;
+  if (fs::exists(file) && !fs::is_regular_file(file)) {
+    return false;
+  }
+  const fs::path folder = file.has_parent_path() ? file.parent_path() : ".";
+  const fs::path caches = folder / "Cache";
+  const bool is_there = fs::exists(caches);
+  return faccessat(AT_FDCWD, (is_there ? caches : folder).c_str(), W_OK, AT_EACCESS) == 0;
+}
+
 }  // namespace
 
 void ForgetDates(Header& element) {
@@ -120,10 +136,8 @@ ExitStatus SaveChecked(const Vexdoc::VEX& document, const std::string& path, boo
   }
   try {
     Utilities::FileSystem::File file(path);
-    // Beside a device there is no place for a cache.
-    const bool is_file = std::filesystem::is_regular_file(path) || !std::filesystem::exists(path);
     ReportReplacedInput(path);
-    document.SaveXML(file, cache && is_file);
+    document.SaveXML(file, cache && HasPlaceForCache(path));
     return ExitStatus::kDone;
   } catch (const Utilities::Exceptions::ResourceException& e) {
     Report(e.what());

@@ -145,6 +145,7 @@ def load(
     path: _Path,
     cache: bool = False,
     *,
+    no_cache: bool = False,
     complete: Mapping[str, str] | None = None,
     wavelengths: WavelengthUse = "check",
 ) -> Document: ...

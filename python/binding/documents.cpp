@@ -84,11 +84,16 @@ int ErrorOfWriting(std::string_view text) {
   return 0;
 }
 
-Owner<VEX> Load(const py::object& given, bool cache, const std::optional<Texts>& complete,
-                const std::string& wavelengths) {
+Owner<VEX> Load(const py::object& given, bool cache, bool no_cache,
+                const std::optional<Texts>& complete, const std::string& wavelengths) {
+  if (cache && no_cache) {
+    throw py::value_error("cache and no_cache: one of them at most");
+  }
   const Path path(given);
   Vexdoc::LoadOptions options = OptionsOf(complete, wavelengths);
-  options.cache = cache ? Vexdoc::CacheUse::kReadAndWrite : Vexdoc::CacheUse::kRead;
+  options.cache = no_cache ? Vexdoc::CacheUse::kNone
+                  : cache  ? Vexdoc::CacheUse::kReadAndWrite
+                           : Vexdoc::CacheUse::kRead;
   const LibraryLock lock;
   const SmartPointer<VEX> document(new VEX);
   Vexdoc::LoadReport report;
@@ -431,13 +436,14 @@ void AddDocuments(py::module_& module) {
   AddSetClass(module);
   AddDocumentClass(module);
   module.def("load", &Load,
-             R"(load(path, cache=False, *, complete=None, wavelengths="check")
+             R"(load(path, cache=False, *, no_cache=False, complete=None, wavelengths="check")
 --
 
-The document in an XML file, or in the cache beside it if that is newer.  What has no dates in the
-file has none in the document.
+The document in an XML file, or in the cache beside it if that is newer and of this very file: the
+same either way.  What has no dates in the file has none in the document.
 
 cache: that is written after the XML was read.
+no_cache: it is not looked at.
 complete: conditions, key to value, for spectra and colours that lack mandatory ones; {} for the
     number of points alone, which comes from the data.
 wavelengths: what is done about spectra whose wavelengths are not those of their conditions, which
@@ -446,8 +452,8 @@ wavelengths: what is done about spectra whose wavelengths are not those of their
 
 Raises FileError, ParseError with the place where the file is no document, WavelengthError, or
 MissingConditionError for what is still missing after a completion.)",
-             arg("path"), arg("cache") = false, py::kw_only(), arg("complete") = py::none(),
-             arg("wavelengths") = "check");
+             arg("path"), arg("cache") = false, py::kw_only(), arg("no_cache") = false,
+             arg("complete") = py::none(), arg("wavelengths") = "check");
   module.def("loads", &Loads, R"(loads(text, *, complete=None, wavelengths="check")
 --
 

@@ -2,7 +2,6 @@
 
 #include <algorithm>
 #include <cerrno>
-#include <cstdio>
 #include <cstdlib>
 #include <initializer_list>
 #include <new>
@@ -111,13 +110,11 @@ using Status = struct stat;
 extern "C" {
 // clang-format off
 FAULTY(int, -1, open, (Path p, int flags, mode_t m), (p, flags, m), EIO, EACCES, EMFILE, ENOSPC, EROFS)
-FAULTY(FILE*, nullptr, fopen64, (Path p, Path mode), (p, mode), EIO, EACCES, EMFILE)
 FAULTY(ssize_t, -1, read, (int f, void* p, std::size_t n), (f, p, Shortened(n)), kShortCount, EINTR, EIO)
 FAULTY(ssize_t, -1, write, (int f, const void* p, std::size_t n), (f, p, Shortened(n)), kShortCount, EINTR, EIO, ENOSPC)
 // Nothing is flushed: only a power cut would tell.
 int fsync(int) { return Fails("fsync", {EIO, ENOSPC}) ? -1 : 0; }
 FAULTY(int, (Next<int(int)>("close")(f), -1), close, (int f), (f), EIO, ENOSPC)
-FAULTY(int, (Next<int(FILE*)>("fclose")(f), EOF), fclose, (FILE* f), (f), EIO, ENOSPC)
 FAULTY(int, -1, rename, (Path from, Path to) noexcept, (from, to), EIO, ENOSPC, EACCES, EROFS)
 FAULTY(int, -1, mkdir, (Path p, mode_t m) noexcept, (p, m), EIO, ENOSPC, EACCES, EROFS)
 FAULTY(int, -1, stat, (Path p, Status* s) noexcept, (p, s), EIO, EACCES)
@@ -126,7 +123,6 @@ FAULTY(int, -1, lstat, (Path p, Status* s) noexcept, (p, s), EIO, EACCES)
 FAULTY(int, -1, faccessat, (int d, Path p, int mode, int flags) noexcept, (d, p, mode, flags), EIO, EACCES, EROFS)
 FAULTY(int, -1, fchmod, (int f, mode_t m) noexcept, (f, m), EIO, EPERM, EROFS)
 FAULTY(int, -1, fchown, (int f, uid_t u, gid_t g) noexcept, (f, u, g), EIO, EPERM)
-FAULTY(off64_t, -1, lseek64, (int f, off64_t n, int origin) noexcept, (f, n, origin), EIO)
 // clang-format on
 
 // All that the objects of this program allocate, by the linker's option --wrap.

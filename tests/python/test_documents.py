@@ -1,6 +1,7 @@
 """Documents: read, walked, built, written."""
 
 import gc
+import os
 import pickle
 from pathlib import Path
 
@@ -182,3 +183,19 @@ def test_tables_have_a_row_for_every_sample() -> None:
     assert numpy.isnan(other).all(axis=1).tolist() == [False, True, True]
     with pytest.raises(aldermoor.MeasureError, match="for other conditions"):
         document["second"]["stored"].color(illuminant="A")
+
+
+def test_a_cache_never_answers_for_another_file_and_can_be_passed_over(tmp_path: Path) -> None:
+    path = tmp_path / "paper.xml"
+    other = tmp_path / "other.xml"
+    for target, name in ((path, "first"), (other, "other")):
+        target.write_text((EXAMPLES / "small.xml").read_text().replace("White", name))
+        os.utime(target, (1_000_000_000, 1_000_000_000))
+    aldermoor.load(path, cache=True)
+    assert (tmp_path / "Cache" / "paper.vexb.stamp").exists()
+    for no_cache in (False, True):
+        assert aldermoor.load(path, no_cache=no_cache)["Set 1"]["first"].name == "first"
+    os.replace(other, path)
+    assert aldermoor.load(path)["Set 1"].samples[0].name == "other"
+    with pytest.raises(ValueError):
+        aldermoor.load(path, cache=True, no_cache=True)

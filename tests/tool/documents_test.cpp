@@ -55,7 +55,10 @@ TEST_F(DocumentsTest, NothingIsWrittenFromWhatCannotBeReadOrDoesNotMatch) {
 }
 
 TEST_F(DocumentsTest, WhatAFileWouldNotBringBackIsToldForEverySampleAndNothingIsWritten) {
-  const std::string spectrum = "'><Value Name='1'>0.5</Value><Value Name='2'>1</Value></Spectrum>";
+  // Where the conditions have them, or nothing would be read.
+  const auto spectrum = [](const std::string& first) {
+    return "'><Value Name='" + first + "'>0.5</Value><Value Name='730'>1</Value></Spectrum>";
+  };
   const std::string color = "'><Value Name='1'>3</Value><Value Name='2'>4</Value></ColorVector>";
   const auto sample = [](const std::string& name, const std::string& attribute) {
     return "<Sample><Name>" + name + "</Name><SampleAttribute>" + attribute +
@@ -66,8 +69,8 @@ TEST_F(DocumentsTest, WhatAFileWouldNotBringBackIsToldForEverySampleAndNothingIs
            "</Attribute></Conditions>";
   };
   WriteFile("l.xml", "<VEX><Name/><SampleSet><Name>S</Name>" +
-                         sample("count", "<Spectrum Conditions='1" + spectrum) +
-                         sample("range", "<Spectrum Conditions='2" + spectrum) +
+                         sample("count", "<Spectrum Conditions='1" + spectrum("380")) +
+                         sample("range", "<Spectrum Conditions='2" + spectrum("0")) +
                          sample("colour", "<ColorVector Conditions='3" + color) + "</SampleSet>" +
                          block("1", "Physical.SpectrumType", "Flash") +
                          block("2", "Physical.WavelengthSpectrumMin", "0.73um") +
@@ -106,19 +109,31 @@ TEST_F(DocumentsTest, ExtractKeepsWhatPassesAndTheHeader) {
 TEST_F(DocumentsTest, CacheIsRebuiltUsedAndRemoved) {
   EXPECT_EQ(Run("cache a.xml").out, "a.xml: Cache/a.vexb: not used: absent\n");
   EXPECT_TRUE(Holds(Run("cache --rebuild a.xml").out, ": used\n"));
-  // What is read now can only come from the cache.
-  EXPECT_EQ(
-      Shell("touch -r a.xml t; echo x > a.xml; touch -r t a.xml; aldermoor info a.xml").status, 0);
+  EXPECT_EQ(Shell("cp -p a.xml good; touch -r a.xml t; echo x > a.xml; touch -r t a.xml; "
+                  "aldermoor info a.xml")
+                .status,
+            3)
+      << "the cache is that of another content";
+  EXPECT_TRUE(Holds(Run("cache a.xml").out, "not used: it belongs to another content"));
   const Result kept = Run("cache --rebuild a.xml nix.xml");
   EXPECT_EQ(kept.status, 3);
   EXPECT_TRUE(Holds(kept.err, "nix.xml: No such file"));
-  EXPECT_EQ(Run("info a.xml").status, 0) << "the cache outlives a document that cannot be read";
+  EXPECT_EQ(Shell("mv good a.xml; test -e Cache/a.vexb && aldermoor cache a.xml").out.substr(0, 19),
+            "a.xml: Cache/a.vexb")
+      << "the cache outlives a document that cannot be read";
+  EXPECT_TRUE(Holds(Run("cache a.xml").out, ": used\n"));
+  EXPECT_EQ(Run("check a.xml").err, "");
+  EXPECT_EQ(Run("info --no-cache a.xml").out, Run("info a.xml").out);
   EXPECT_EQ(Shell("touch -r Cache/a.vexb a.xml").status, 0);
   EXPECT_TRUE(Holds(Run("cache a.xml").out, "not used: not later than the document"));
   EXPECT_EQ(Shell("truncate -s 40 Cache/a.vexb; touch -d '+9 sec' Cache/a.vexb").status, 0);
   EXPECT_TRUE(Holds(Run("cache a.xml").out, "Cache/a.vexb, 40 bytes, "));
   EXPECT_TRUE(Holds(Run("cache a.xml").out, "not used: broken at 0x"));
+  EXPECT_TRUE(Holds(Run("check a.xml").err, "a.xml: the cache is not used: broken at 0x"));
+  EXPECT_EQ(Run("check a.xml").status, 0);
+  EXPECT_TRUE(Holds(Run("check --format json a.xml").out, R"("used": false)"));
   EXPECT_EQ(Run("cache --remove a.xml").out, "a.xml: Cache/a.vexb: removed\n");
+  EXPECT_EQ(Shell("ls Cache").out, "") << "nor is there a stamp";
   EXPECT_EQ(Shell("mv b.xml b.paper.XML; aldermoor cache b.paper.XML").out,
             "b.paper.XML: Cache/b.paper.vexb: not used: absent\n");
 }

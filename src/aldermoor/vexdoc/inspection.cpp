@@ -1,20 +1,26 @@
 #include "aldermoor/vexdoc/inspection.h"
 
 #include <array>
+#include <cstdio>
+#include <filesystem>
 #include <istream>
 #include <string_view>
 
+#include "aldermoor/utilities/exceptions/exceptions.h"
 #include "aldermoor/utilities/exceptions/frame.h"
 #include "aldermoor/utilities/filesystem/posix/filecontent.h"
+#include "aldermoor/utilities/filesystem/posix/regularfile.h"
 #include "aldermoor/vexdoc/internals/cachedump.h"
 #include "aldermoor/vexdoc/internals/cachewalker.h"
 #include "aldermoor/vexdoc/internals/documentchecker.h"
 #include "aldermoor/vexdoc/internals/faulttext.h"
+#include "aldermoor/vexdoc/internals/xmlcache.h"
 #include "aldermoor/vexdoc/internals/xmlchecker.h"
 #include "aldermoor/vexdoc/vex.h"
 
 namespace Aldermoor::Vexdoc {
 
+using Platform::Posix::RegularFile;
 using Utilities::FileSystem::File;
 
 namespace {
@@ -32,7 +38,7 @@ Bytes ReadAll(std::istream& in) {
 }
 
 Bytes ReadAll(const File& file) {
-  return Platform::Posix::ReadFileContent(file.GetAbsolutePlatformName());
+  return Platform::Posix::ReadFileContent(file.GetAbsolutePlatformName()).bytes;
 }
 
 std::string MessageOf(const std::vector<DocumentFault>& faults) {
@@ -45,6 +51,19 @@ std::string MessageOf(const std::vector<DocumentFault>& faults) {
 
 std::string_view View(const Bytes& bytes) {
   return {bytes.data(), bytes.size()};
+}
+
+// "broken at 0x00000027: ...", or nothing.
+std::string FirstError(std::string_view cache) {
+  for (const Fault& fault : Internals::CacheWalker(cache).Walk()) {
+    if (fault.severity == Fault::Severity::kError) {
+      constexpr std::size_t kLongest = 64;
+      std::array<char, kLongest> place{};
+      std::snprintf(place.data(), place.size(), "broken at 0x%08llx: ", fault.offset);
+      return place.data() + fault.text;
+    }
+  }
+  return "";
 }
 
 }  // namespace
@@ -70,6 +89,26 @@ std::vector<Fault> CheckCache(std::istream& in) try {
   return Internals::CacheWalker(View(bytes)).Walk();
 }
 ALDERMOOR_FRAME(Aldermoor::Vexdoc::CheckCache)
+
+CacheState StateOfCache(const File& xml) try {
+  Internals::XmlCache cache(xml);
+  const std::string path = cache.GetFile().GetAbsolutePlatformName();
+  CacheState state;
+  state.path = cache.GetFile().GetAbsoluteName();
+  try {
+    state.reason = cache.Find(Internals::XmlCache::Need::kExact).reason;
+    const RegularFile file(path, RegularFile::Link::kRefuse);
+    // Of what is not used anyway, damage is the reason that helps most.
+    const std::string fault = file.IsOpen() ? FirstError(View(file.Read())) : "";
+    state.reason = fault.empty() ? state.reason : fault;
+  } catch (const Utilities::Exceptions::ResourceNotAvailableException& e) {
+    state.reason = e.what();
+  }
+  state.exists = std::filesystem::exists(std::filesystem::symlink_status(path));
+  state.is_used = state.reason.empty();
+  return state;
+}
+ALDERMOOR_FRAME(Aldermoor::Vexdoc::StateOfCache)
 
 bool DumpCache(std::istream& in, std::ostream& out) try {
   const Bytes bytes = ReadAll(in);

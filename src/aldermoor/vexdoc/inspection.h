@@ -65,6 +65,21 @@ ALDERMOOR_EXPORT std::vector<Fault> CheckCache(const Utilities::FileSystem::File
 /// The same of all that `in` still holds.
 ALDERMOOR_EXPORT std::vector<Fault> CheckCache(std::istream& in);
 
+/// Which of the two a load of a document takes.
+struct CacheState {
+  /// The absolute name of the cache.
+  std::string path;
+  /// Whether anything is there.
+  bool exists = false;
+  /// Whether a load with options that allow it takes the cache.
+  bool is_used = false;
+  /// Why it does not: "absent", or plain words that go on after "not used: "; empty if it does.
+  std::string reason;
+};
+
+/// Looks at the cache of the XML file `xml` as VEX::LoadXML does, and changes nothing.
+ALDERMOOR_EXPORT CacheState StateOfCache(const Utilities::FileSystem::File& xml);
+
 /// Writes the bytes of a binary cache for people: a line or more a field with its offset and bytes
 /// in hexadecimal and what they mean in words, indented by nesting.
 ///

@@ -12,11 +12,11 @@
 /// What a load may do beyond the plain ones, and what it tells.
 namespace Aldermoor::Vexdoc {
 
-/// The use of the binary cache beside an XML file.
+/// What a load does with the binary cache beside an XML file.
 enum class CacheUse {
-  kNone,
-  kRead,
-  kReadAndWrite,  ///< It is written after the XML was read.
+  kNone,          ///< Reads the XML file; the cache is neither looked at nor written.
+  kRead,          ///< Reads a cache that holds what the XML file says, and writes none.
+  kReadAndWrite,  ///< Reads such a one, or else writes it after the XML file was read.
 };
 
 /// What is done about spectra whose wavelengths in the file are not those of their conditions.
@@ -35,7 +35,7 @@ struct LoadOptions {
   WavelengthUse wavelengths = WavelengthUse::kRefuse;
   /// Asks for CompleteConditions, ahead of the look at the wavelengths.  Spectra that still lack a
   /// range afterwards are told as such only.
-  std::optional<Completion> completion;
+  std::optional<Completion> completion = std::nullopt;
 };
 
 /// What a load found and did.
@@ -56,8 +56,11 @@ struct LoadReport {
   /// At most so many are listed.
   static constexpr std::size_t kMostListed = 100;
 
+  /// Whether the document came from the cache; it is the same either way.
   bool from_cache = false;
-  std::string cache_reason;  ///< Why the cache was not read; empty if it was.
+  /// Why not, in plain words that go on after "not used: ", as StateOfCache has them; empty if it
+  /// did, or if the cache was not looked at.
+  std::string cache_reason;
   std::vector<Contradiction> contradictions;
   std::size_t contradiction_count = 0;  ///< Those that are not listed too.
   /// Ranges such as "31 from 400nm to 700nm" and how many spectra took them from their points.

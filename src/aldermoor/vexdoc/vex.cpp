@@ -1,24 +1,24 @@
 #include "aldermoor/vexdoc/vex.h"
 
+#include <filesystem>
 #include <istream>
 #include <ostream>
 #include <stdexcept>
-#include <string_view>
 
 #include "aldermoor/utilities/exceptions/exceptions.h"
 #include "aldermoor/utilities/exceptions/frame.h"
-#include "aldermoor/utilities/filesystem/path.h"
-#include "aldermoor/utilities/filesystem/posix/filestamp.h"
+#include "aldermoor/utilities/filesystem/posix/filereplacement.h"
 #include "aldermoor/vexdoc/elementvisitor.h"
 #include "aldermoor/vexdoc/internals/binaryprovider.h"
 #include "aldermoor/vexdoc/internals/xercesadapter.h"
+#include "aldermoor/vexdoc/internals/xmlcache.h"
 #include "aldermoor/vexdoc/loadoptions.h"
 #include "aldermoor/vexdoc/vexexception.h"
 #include "aldermoor/vexdoc/vexnode.inl.h"
 
 namespace Aldermoor::Vexdoc {
 
-using Platform::Posix::FileStamp;
+using Internals::XmlCache;
 using Utilities::Exceptions::OutOfRangeException;
 using Utilities::Exceptions::ResourceNotAvailableException;
 using Utilities::FileSystem::File;
@@ -37,58 +37,41 @@ SmartPointer<Internals::BinaryProvider> GetBinaryProvider(const VEX& document) {
       new Internals::BinaryProvider(const_cast<VEX*>(&document)));
 }
 
-constexpr const char* kCacheDirectory = "Cache";
-
-// "Cache/paper.vexb" beside "paper.xml".
-File GetCacheFile(const File& xml) {
-  namespace FileSystem = Utilities::FileSystem;
-  constexpr std::string_view kExtension = ".xml";
-  std::string stem = xml.GetName();
-  if (xml.IsOfType(std::string(kExtension))) {
-    stem.resize(stem.size() - kExtension.size());
-  }
-  const std::string directory =
-      FileSystem::JoinPath(FileSystem::ParentPath(xml.GetAbsoluteName()), kCacheDirectory);
-  return File(FileSystem::JoinPath(directory, stem + ".vexb"), 0, 0);
-}
-
-FileStamp StampOf(const File& file) {
-  return FileStamp(file.GetAbsolutePlatformName());
-}
-
-// Whatever is wrong with a cache, the XML file is there.
-bool LoadFromCache(VEX& document, File& cache, const File& xml) {
+// Why the document did not come from the cache; empty if it did.  Whatever is wrong with a cache,
+// the XML file is there.
+std::string LoadFromCache(VEX& document, const XmlCache& cache, XmlCache::Need need, CacheUse use) {
+  XmlCache::Found found;
   try {
-    // Not by the dates of File: that of a file which cannot be opened for a moment is the present.
-    if (!cache.IsAccessable(false) || !StampOf(cache).IsLaterThan(StampOf(xml))) {
-      return false;
+    found = cache.Find(need);
+    if (!found.IsUsable()) {
+      return found.reason;
     }
-    GetBinaryProvider(document)->Read(cache);
-    return true;
-  } catch (...) {
-    return false;
+    GetBinaryProvider(document)->Read(found.GetBytes());
+  } catch (const std::exception& e) {
+    return e.what();
   }
-}
-
-// Another process may have replaced the XML file while the cache of the former one was written.
-void DropCacheOfOldFile(const File& cache, const File& xml, const FileStamp& stamp) {
-  if (StampOf(xml) != stamp) {
-    cache.Remove();
-  }
-}
-
-void RemoveQuietly(const File& file) {
   try {
-    file.Remove();
+    if (found.renewed && use == CacheUse::kReadAndWrite) {
+      cache.Renew(*found.renewed);
+    }
+  } catch (const std::exception&) {
+    // The next load has to read the XML file once more.
+  }
+  return "";
+}
+
+void RemoveQuietly(const XmlCache& cache) {
+  try {
+    cache.Remove();
   } catch (...) {
     // Memory is short, and there is nobody to tell.
   }
 }
 
-void LoadFromText(Internals::XMLParserAdapter& adapter, const File& file) {
+Internals::XmlReading LoadFromText(Internals::XMLParserAdapter& adapter, const File& file) {
   try {
     File xml(file.GetAbsoluteName());
-    adapter.Load(xml);
+    return adapter.Load(xml);
   } catch (const VexException&) {
     throw;
   } catch (const std::exception& e) {
@@ -97,14 +80,40 @@ void LoadFromText(Internals::XMLParserAdapter& adapter, const File& file) {
 }
 
 // The document is loaded all the same if that fails.
-void UpdateCacheQuietly(const VEX& document, File& cache, const File& xml, const FileStamp& stamp) {
+void UpdateCacheQuietly(VEX& document, XmlCache& cache, const Internals::XmlReading& reading,
+                        bool is_exact) {
   try {
-    xml.GetDirectory().CreateSubdir(kCacheDirectory);
-    GetBinaryProvider(document)->Write(cache);
-    DropCacheOfOldFile(cache, xml, stamp);
+    cache.Write(document, reading, is_exact);
   } catch (...) {
     RemoveQuietly(cache);
   }
+}
+
+// The document that the XML of a save gives when it is read: without the digits that the text does
+// not carry, and whatever else.  A cache of what was in memory would differ from its XML file.
+void WriteCacheOfSaved(const File& file, const Platform::Posix::ContentMark& written) {
+  XmlCache cache(file);
+  VEX stored;
+  LoadOptions options;
+  options.wavelengths = WavelengthUse::kReport;
+  LoadReport report;
+  Internals::XercesAdapter adapter(&stored);
+  adapter.SetOptions(options, report);
+  Internals::XmlReading reading;
+  try {
+    File xml(file.GetAbsoluteName());
+    reading = adapter.Load(xml);
+  } catch (const VexException&) {
+    cache.Remove();  // for text that a load refuses
+    return;
+  } catch (const ResourceNotAvailableException&) {
+    cache.Remove();  // for a file that its writer may not read
+    return;
+  }
+  if (reading.hash == written.hash && reading.state.size == written.size) {
+    cache.Write(stored, reading, adapter.WasExact());
+  }
+  // Else somebody has replaced the file since, and writes a cache of his own.
 }
 
 void ApplyTypeCreator(File& file) {
@@ -150,54 +159,51 @@ void VEX::Store(std::ostream& out) const try { GetXMLParserAdapter(*this)->Store
 ALDERMOOR_FRAME(Aldermoor::Vexdoc::VEX::Store)
 
 void VEX::LoadXML(const File& file, bool updateCache) try {
-  File cache = GetCacheFile(file);
-  if (LoadFromCache(*this, cache, file)) {
+  XmlCache cache(file);
+  const CacheUse use = updateCache ? CacheUse::kReadAndWrite : CacheUse::kRead;
+  if (LoadFromCache(*this, cache, XmlCache::Need::kAny, use).empty()) {
     return;
   }
-  const FileStamp stamp = StampOf(file);
-  LoadFromText(*GetXMLParserAdapter(*this), file);
+  Internals::XercesAdapter adapter(this);
+  const Internals::XmlReading reading = LoadFromText(adapter, file);
   if (updateCache) {
-    UpdateCacheQuietly(*this, cache, file, stamp);
+    UpdateCacheQuietly(*this, cache, reading, adapter.WasExact());
   }
 }
 ALDERMOOR_FRAME(Aldermoor::Vexdoc::VEX::LoadXML)
 
 LoadReport VEX::LoadXML(const File& file, const LoadOptions& options) try {
   LoadReport report;
-  File cache = GetCacheFile(file);
-  const bool reads_cache =
-      options.cache != CacheUse::kNone && options.wavelengths != WavelengthUse::kComplete;
-  if (reads_cache && LoadFromCache(*this, cache, file)) {
-    report.from_cache = true;
+  XmlCache cache(file);
+  // A cache does not hold the points of the file, from which a range is taken.
+  if (options.cache != CacheUse::kNone && options.wavelengths != WavelengthUse::kComplete) {
+    report.cache_reason = LoadFromCache(*this, cache, XmlCache::Need::kExact, options.cache);
+    report.from_cache = report.cache_reason.empty();
+  }
+  if (report.from_cache) {
     if (options.completion) {
       report.completion = CompleteConditions(*this, *options.completion);
     }
     return report;
   }
-  report.cache_reason = reads_cache ? "there is no good one" : "it was not asked for";
-  const FileStamp stamp = StampOf(file);
   Internals::XercesAdapter adapter(this);
   adapter.SetOptions(options, report);
-  LoadFromText(adapter, file);
+  const Internals::XmlReading reading = LoadFromText(adapter, file);
   // A cache answers for the file, not for what was added to its document.
   if (options.cache == CacheUse::kReadAndWrite && adapter.WasExact() && !report.HasCompleted()) {
-    UpdateCacheQuietly(*this, cache, file, stamp);
+    UpdateCacheQuietly(*this, cache, reading, true);
   }
   return report;
 }
 ALDERMOOR_FRAME(Aldermoor::Vexdoc::VEX::LoadXML)
 
 void VEX::SaveXML(File& file, bool updateCache) const try {
-  const FileStamp stamp = GetXMLParserAdapter(*this)->Store(file);
+  const Platform::Posix::ContentMark written = GetXMLParserAdapter(*this)->Store(file);
   ApplyTypeCreator(file);
-  if (!updateCache) {
-    return;
+  // Beside a device there is no place for a cache, and a pipe is not read again.
+  if (updateCache && std::filesystem::is_regular_file(file.GetAbsolutePlatformName())) {
+    WriteCacheOfSaved(file, written);
   }
-  file.GetDirectory().CreateSubdir(kCacheDirectory);
-  File cache = GetCacheFile(file);
-  GetBinaryProvider(*this)->Write(cache);
-  ApplyTypeCreator(cache);
-  DropCacheOfOldFile(cache, file, stamp);
 }
 ALDERMOOR_FRAME(Aldermoor::Vexdoc::VEX::SaveXML)
 

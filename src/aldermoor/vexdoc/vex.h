@@ -60,24 +60,29 @@ class ALDERMOOR_EXPORT VEX
   /// VexException if its content breaks a rule.
   void Load(std::istream& in) override;
   /// Replaces the content of this document by that of the XML file `file`, or of its cache if that
-  /// is newer and good; on failure it stays as it was.
+  /// is newer, good and of this very file; on failure it stays as it was.
   ///
-  /// The cache of "paper.xml" is "Cache/paper.vexb" beside it.  With `updateCache`, it is written
-  /// after the XML was read; a failure of that is not reported.
+  /// The cache of "paper.xml" is "Cache/paper.vexb" beside it, and "Cache/paper.vexb.stamp" ties it
+  /// to the bytes of the XML file, by size, times and hash (docs/binaryformat.md).  With
+  /// `updateCache`, it is written after the XML was read; a failure of that is not reported.
   /// Throws: VexXMLParseException with file, line and column if the text is not well-formed;
   /// VexParseException and VexException if its content breaks a rule or the file cannot be read.
   void LoadXML(const Utilities::FileSystem::File& file, bool updateCache);
   /// The same two, but with nothing in the document that the text does not say: elements for which
   /// it has no dates have none, and spectra whose wavelengths are not those of their conditions are
-  /// refused, completed or told as `options` ask (loadoptions.h).  On failure, the document stays
-  /// as it was with both. Throws: WavelengthException with sets, samples and wavelengths; what the
-  /// plain ones throw.
+  /// refused, completed or told as `options` ask (loadoptions.h).  A cache is taken only if its
+  /// stamp says that it holds exactly what the XML file does.  On failure, the document stays as it
+  /// was with both. Throws: WavelengthException with sets, samples and wavelengths; what the plain
+  /// ones throw.
   LoadReport Load(std::istream& in, const LoadOptions& options);
   LoadReport LoadXML(const Utilities::FileSystem::File& file, const LoadOptions& options);
-  /// Writes this document to `file` as Store does, and with `updateCache` to its cache.
+  /// Writes this document to `file` as Store does.  With `updateCache`, the text is read again, and
+  /// the document that it gives written to the cache; text that a load refuses gets none.
   ///
-  /// Files are replaced as a whole: on failure the old file is still there.  The process locale is
-  /// changed for the time of the call, so nothing that depends on it may run beside it.
+  /// Files are replaced as a whole: on failure the old file is still there.  Only where a file may
+  /// be written but not be replaced, for lack of rights in its folder, it is written in place.
+  /// Permissions of a cache are those of its XML file.  The process locale is changed for the time
+  /// of the call, so nothing that depends on it may run beside it.
   /// Throws: ResourceNotAvailableException with the system's reason if a file cannot be written;
   /// what Store throws.
   void SaveXML(Utilities::FileSystem::File& file, bool updateCache) const;

@@ -58,8 +58,9 @@ inline void LoadText(VEX& document, const std::string& text) {
 /// A directory that lives as long as this object.
 class TemporaryDirectory {
  public:
-  TemporaryDirectory() {
-    std::string name = (std::filesystem::temp_directory_path() / "aldermoor-XXXXXX").string();
+  explicit TemporaryDirectory(
+      const std::filesystem::path& parent = std::filesystem::temp_directory_path()) {
+    std::string name = (parent / "aldermoor-XXXXXX").string();
     if (mkdtemp(name.data()) == nullptr) {
       throw std::runtime_error("no temporary directory");
     }

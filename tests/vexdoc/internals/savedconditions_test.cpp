@@ -135,7 +135,7 @@ TEST_F(SavedConditionsTest, AFileWithUnknownAttributesKeepsItsLinksThroughSaves)
            "<Conditions><ID>2</ID><Attribute Name='k'>links: two</Attribute></Conditions></VEX>");
   sample_ = document_.GetSampleSets().front().second->GetSamples().front().second;
   Add(Own("1", "links: three"));
-  Add(Own("2", "links: one"));
+  Add(Own("2", "links: four"));
   ExpectSaved(4);
 }
 

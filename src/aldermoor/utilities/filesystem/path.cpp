@@ -34,7 +34,12 @@ std::string JoinPath(const std::string& directory, const std::string& name) {
 }
 
 bool IsAbsolutePath(const std::string& path) {
-  return path.starts_with('/') || path.starts_with('\\') || (path.size() > 1 && path[1] == ':');
+  // Whatever the locale says of letters.
+  const auto is_letter = [](char c) {
+    return (c >= 'a' && c <= 'z') || (c >= 'A' && c <= 'Z');
+  };
+  return path.starts_with('/') || path.starts_with('\\') ||
+         (path.size() > 1 && is_letter(path[0]) && path[1] == ':');
 }
 
 }  // namespace Aldermoor::Utilities::FileSystem

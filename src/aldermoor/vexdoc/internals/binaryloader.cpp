@@ -1,5 +1,6 @@
 #include "aldermoor/vexdoc/internals/binaryloader.h"
 
+#include <algorithm>
 #include <bit>
 #include <istream>
 #include <type_traits>
@@ -31,19 +32,29 @@ namespace {
                                       ALDERMOOR_HERE(Aldermoor::Vexdoc::Internals::BinaryLoader));
 }
 
-std::uint64_t BytesLeft(std::istream& in) {
+std::uint32_t NumberAt(const char* bytes) {
+  BinaryFormat::Bytes number;
+  std::copy_n(bytes, number.size(), number.begin());
+  return BinaryFormat::FromLittleEndian(number);
+}
+
+std::string ReadRest(std::istream& in) {
   std::streambuf& buffer = *in.rdbuf();
   const std::streamoff here = buffer.pubseekoff(0, std::ios_base::cur, std::ios_base::in);
   const std::streamoff end = buffer.pubseekoff(0, std::ios_base::end, std::ios_base::in);
-  if (here < 0 || end < here || buffer.pubseekpos(here, std::ios_base::in) < 0) {
-    return 0;
+  if (in.eof() || here < 0 || end < here || buffer.pubseekpos(here, std::ios_base::in) < 0) {
+    return "";
   }
-  return static_cast<std::uint64_t>(end - here);
+  std::string bytes(static_cast<std::size_t>(end - here), '\0');
+  bytes.resize(static_cast<std::size_t>(buffer.sgetn(bytes.data(), end - here)));
+  return bytes;
 }
 
 }  // namespace
 
-BinaryLoader::BinaryLoader(std::istream& in) : in_(in), bytes_left_(BytesLeft(in)) {}
+BinaryLoader::BinaryLoader(std::istream& in) : owned_(ReadRest(in)), bytes_left_(owned_) {}
+
+BinaryLoader::BinaryLoader(std::string_view bytes) : bytes_left_(bytes) {}
 
 BinaryLoader::~BinaryLoader() = default;
 
@@ -110,6 +121,8 @@ void BinaryLoader::LoadSampleAttribute(Attribute& attribute) {
 }
 
 void BinaryLoader::LoadHeader(Header& header) try {
+  // The file has all of them; what the constructor has put in is of the time of this load.
+  DocumentAccess::ClearAttributes(header);
   for (std::uint32_t count = ReadNumber(); count > 0; --count) {
     const std::string key = ReadString();
     header.SetAttribute(key, ReadString());
@@ -123,7 +136,7 @@ void BinaryLoader::LoadMembers(Spectrum& spectrum) {
 
 void BinaryLoader::LoadVector(std::vector<float>& target) {
   const std::uint64_t count = ReadNumber();
-  if (count * sizeof(BinaryFormat::Bytes) > bytes_left_) {
+  if (count * sizeof(BinaryFormat::Bytes) > bytes_left_.size()) {
     FailAtEnd("EOF while reading float");
   }
   target.resize(count);
@@ -226,46 +239,42 @@ void BinaryLoader::RelinkConditions(VEX& vex) try {
 ALDERMOOR_FRAME(Aldermoor::Vexdoc::Internals::BinaryLoader::RelinkConditions)
 
 std::uint32_t BinaryLoader::ReadNumber() {
-  BinaryFormat::Bytes bytes;
-  if (!Read(bytes.data(), bytes.size())) {
+  const char* const bytes = Take(BinaryFormat::kNumberSize);
+  if (bytes == nullptr) {
     FailAtEnd("EOF while reading number");
   }
-  return BinaryFormat::FromLittleEndian(bytes);
+  return NumberAt(bytes);
 }
 
 std::string BinaryLoader::ReadString() {
-  BinaryFormat::Bytes bytes;
-  if (!Read(bytes.data(), bytes.size())) {
+  const char* const length = Take(BinaryFormat::kNumberSize);
+  if (length == nullptr) {
     FailAtEnd("EOF while reading string");
   }
-  const std::size_t length = BinaryFormat::FromLittleEndian(bytes);
-  if (length > bytes_left_) {
+  const std::size_t count = NumberAt(length);
+  const char* const text = Take(count);
+  if (text == nullptr) {
     FailAtEnd("EOF while reading string");
   }
-  std::string text(length, '\0');
-  if (!Read(text.data(), length)) {
-    FailAtEnd("EOF while reading string");
-  }
-  return text;
+  return {text, count};
 }
 
 float BinaryLoader::ReadFloat() {
-  BinaryFormat::Bytes bytes;
-  if (!Read(bytes.data(), bytes.size())) {
+  const char* const bytes = Take(BinaryFormat::kNumberSize);
+  if (bytes == nullptr) {
     FailAtEnd("EOF while reading float");
   }
-  return std::bit_cast<float>(BinaryFormat::FromLittleEndian(bytes));
+  return std::bit_cast<float>(NumberAt(bytes));
 }
 
-// Straight from the buffer: a formatted stream would look after its state for every four bytes.
-bool BinaryLoader::Read(char* bytes, std::size_t count) {
-  if (count > bytes_left_ || in_.eof()) {
-    in_.setstate(std::ios_base::eofbit);
-    return false;
+const char* BinaryLoader::Take(std::size_t count) {
+  if (count > bytes_left_.size()) {
+    bytes_left_ = {};  // nothing behind the end of the file
+    return nullptr;
   }
-  bytes_left_ -= count;
-  return in_.rdbuf()->sgetn(bytes, static_cast<std::streamsize>(count)) ==
-         static_cast<std::streamsize>(count);
+  const char* const bytes = bytes_left_.data();
+  bytes_left_.remove_prefix(count);
+  return bytes;
 }
 
 }  // namespace Aldermoor::Vexdoc::Internals

@@ -1,10 +1,12 @@
 #ifndef ALDERMOOR_VEXDOC_INTERNALS_BINARYLOADER_H
 #define ALDERMOOR_VEXDOC_INTERNALS_BINARYLOADER_H
 
+#include <cstddef>
 #include <cstdint>
 #include <iosfwd>
 #include <map>
 #include <string>
+#include <string_view>
 #include <utility>
 #include <vector>
 
@@ -25,8 +27,10 @@ namespace Aldermoor::Vexdoc::Internals {
 /// lacks; what the constructors of the attributes throw.
 class BinaryLoader : public ElementVisitor {
  public:
-  /// `in` is kept by reference.  Nothing is read from one without positions, such as a pipe.
+  /// Reads `in` to its end at once.  Nothing is read from one without positions, such as a pipe.
   explicit BinaryLoader(std::istream& in);
+  /// `bytes` must outlive this object.
+  explicit BinaryLoader(std::string_view bytes);
   ~BinaryLoader() override;
 
   Utilities::Tools::SmartPointer<VEX> Load();
@@ -63,12 +67,12 @@ class BinaryLoader : public ElementVisitor {
   void LoadCustomIllumination(Conditions& conditions);
   void RelinkConditions(VEX& vex);
 
-  // Whether all `count` bytes were there.
-  bool Read(char* bytes, std::size_t count);
+  // Takes `count` bytes from the front of what is left; null if there are fewer.
+  const char* Take(std::size_t count);
 
   std::map<std::string, std::string> condition_links_;  // ID in the file to ID in the manager
-  std::istream& in_;
-  std::uint64_t bytes_left_ = 0;
+  std::string owned_;                                   // of a stream
+  std::string_view bytes_left_;                         // of the file
   unsigned int tree_depth_ = 0;
   // Colours in the order of the file, whose constructor needs the real conditions.
   std::vector<std::pair<ColorVector*, Channels>> pending_colors_;

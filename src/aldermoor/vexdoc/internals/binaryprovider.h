@@ -1,7 +1,12 @@
 #ifndef ALDERMOOR_VEXDOC_INTERNALS_BINARYPROVIDER_H
 #define ALDERMOOR_VEXDOC_INTERNALS_BINARYPROVIDER_H
 
+#include <string_view>
+
+#include <sys/stat.h>
+
 #include "aldermoor/utilities/filesystem/file.h"
+#include "aldermoor/utilities/filesystem/posix/filereplacement.h"
 #include "aldermoor/vexdoc/vex.h"
 
 namespace Aldermoor::Vexdoc::Internals {
@@ -21,7 +26,15 @@ class BinaryProvider {
   /// throws.  The old file then stays.
   virtual void Write(Utilities::FileSystem::File& file);
 
+  /// The same from the bytes of a cache.
+  void Read(std::string_view bytes);
+  /// Writes to a file that belongs to the one of which `owner` is the status; whatever bears its
+  /// name is replaced itself.  Returns the mark of the bytes written.
+  Platform::Posix::ContentMark Write(Utilities::FileSystem::File& file, const struct stat& owner);
+
  private:
+  Platform::Posix::ContentMark WriteTo(Platform::Posix::FileReplacement& replacement);
+
   VEX* document_;
 };
 

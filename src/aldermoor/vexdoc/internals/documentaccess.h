@@ -27,6 +27,8 @@ class DocumentAccess {
     first.attributes_.swap(second.attributes_);
   }
 
+  static void ClearAttributes(Header& header) noexcept { header.attributes_.clear(); }
+
   static std::vector<float>& Data(Spectrum& spectrum) { return spectrum.data_; }
 
   /// Replaces an attribute by `content`, but keeps its header, conditions and flag.

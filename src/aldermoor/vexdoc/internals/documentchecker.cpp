@@ -42,16 +42,18 @@ bool IsStandardKey(const std::string& key) {
                      [&key](const auto& standard) { return key == standard.key; });
 }
 
-// Whether `text` means the whole nm that are read from it, as "0.38um" does not.
+// Whether `text` means the whole nm that are read from it, or parts of one more, as "0.38um" does
+// not.
 bool NamesWavelength(const std::string& text, std::int64_t wavelength) {
   std::string_view rest = text;
   const auto skip_blanks = [&rest] {
     rest.remove_prefix(std::min(rest.find_first_not_of(" \t"), rest.size()));
   };
   skip_blanks();
+  rest.remove_prefix(rest.starts_with('+') ? 1 : 0);
   double number = 0.0;
   const auto [stopped, error] = std::from_chars(rest.data(), rest.data() + rest.size(), number);
-  if (error != std::errc() || number != static_cast<double>(wavelength)) {
+  if (error != std::errc() || std::trunc(number) != static_cast<double>(wavelength)) {
     return false;
   }
   rest.remove_prefix(static_cast<std::size_t>(stopped - rest.data()));

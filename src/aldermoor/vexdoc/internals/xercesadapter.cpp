@@ -97,7 +97,7 @@ void XercesAdapter::Load(std::istream& in) try {
 }
 ALDERMOOR_FRAME(Aldermoor::Vexdoc::Internals::XercesAdapter::Load)
 
-void XercesAdapter::Load(File& file) try {
+XmlReading XercesAdapter::Load(File& file) try {
   RequireXMLPlatform();
   const std::string path = file.GetAbsolutePlatformName();
   if (!file.IsAccessable(false)) {
@@ -108,7 +108,10 @@ void XercesAdapter::Load(File& file) try {
   try {
     // Not by the parser: a pipe gives its bytes once, and a second parse may want them again; and
     // the parser does not close a file when memory runs out in between.
-    LoadFrom(Platform::Posix::ReadFileContent(path), path);
+    const std::int64_t now = XmlReading::Now();
+    const Platform::Posix::FileContent content = Platform::Posix::ReadFileContent(path);
+    LoadFrom(content.bytes, path);
+    return XmlReading(now, content.status, {content.bytes.data(), content.bytes.size()});
   } catch (const XMLException& e) {
     FailInternally(kLoadingFailure, e.getMessage());
   } catch (const xercesc::DOMException& e) {  // for an XML version that the parser knows half
@@ -141,7 +144,7 @@ void XercesAdapter::Store(std::ostream& out) try {
 }
 ALDERMOOR_FRAME(Aldermoor::Vexdoc::Internals::XercesAdapter::Store)
 
-Platform::Posix::FileStamp XercesAdapter::Store(File& file) try {
+Platform::Posix::ContentMark XercesAdapter::Store(File& file) try {
   const LocaleGuard guard(".ACP");
   Platform::Posix::FileReplacement replacement(file.GetAbsolutePlatformName());
   Store(replacement.GetStream());

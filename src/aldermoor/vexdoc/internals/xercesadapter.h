@@ -31,7 +31,7 @@ class XercesAdapter : public XMLParserAdapter {
   void Load(std::istream& in) override;
   /// Throws: ResourceNotAvailableException for a file that cannot be read; else what the parse and
   /// the loader throw.
-  void Load(Utilities::FileSystem::File& file) override;
+  XmlReading Load(Utilities::FileSystem::File& file) override;
 
   /// Writes the document in the current dialect, in UTF-8.
   /// Throws: VexException with the failure's text.
@@ -39,7 +39,7 @@ class XercesAdapter : public XMLParserAdapter {
   /// The same to a file, which is replaced as a whole.  The locale of the process is changed for
   /// the time of the call.
   /// Throws: ResourceNotAvailableException for a file that cannot be written.
-  Platform::Posix::FileStamp Store(Utilities::FileSystem::File& file) override;
+  Platform::Posix::ContentMark Store(Utilities::FileSystem::File& file) override;
 
   /// Makes loads follow `options` and fill `report`; both outlive this object.  They throw
   /// WavelengthException then, and give no dates that the text does not hold.

@@ -4,7 +4,8 @@
 #include <iosfwd>
 
 #include "aldermoor/utilities/filesystem/file.h"
-#include "aldermoor/utilities/filesystem/posix/filestamp.h"
+#include "aldermoor/utilities/filesystem/posix/filereplacement.h"
+#include "aldermoor/vexdoc/internals/cachestamp.h"
 
 namespace Aldermoor::Vexdoc::Internals {
 
@@ -17,10 +18,11 @@ class XMLParserAdapter {
   virtual ~XMLParserAdapter() = default;
 
   virtual void Load(std::istream& in) = 0;
-  virtual void Load(Utilities::FileSystem::File& file) = 0;
+  /// Returns what was read.
+  virtual XmlReading Load(Utilities::FileSystem::File& file) = 0;
   virtual void Store(std::ostream& out) = 0;
-  /// Returns the stamp of the file written, whoever has replaced it since.
-  virtual Platform::Posix::FileStamp Store(Utilities::FileSystem::File& file) = 0;
+  /// Returns the mark of the bytes written, whoever has replaced them since.
+  virtual Platform::Posix::ContentMark Store(Utilities::FileSystem::File& file) = 0;
 };
 
 }  // namespace Aldermoor::Vexdoc::Internals

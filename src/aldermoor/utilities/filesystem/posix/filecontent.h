@@ -4,11 +4,23 @@
 #include <string>
 #include <vector>
 
+#include <sys/stat.h>
+
 namespace Aldermoor::Platform::Posix {
 
-/// All bytes of the file at `path`; of a pipe, what comes until its other end is closed.
+/// What a file holds, with the status that the very same file had before its bytes were read.
+struct FileContent {
+  std::vector<char> bytes;
+  struct stat status {};
+};
+
+/// The file at `path`; of a pipe, what comes until its other end is closed.
 /// Throws: ResourceNotAvailableException with the name and the system's reason.
-std::vector<char> ReadFileContent(const std::string& path);
+FileContent ReadFileContent(const std::string& path);
+
+/// What an open file still holds; `path` is for messages.
+/// Throws: ResourceNotAvailableException with the name and the system's reason.
+std::vector<char> ReadAll(int descriptor, const struct stat& status, const std::string& path);
 
 }  // namespace Aldermoor::Platform::Posix
 
