@@ -275,9 +275,11 @@ TEST_F(FaultsTest, ASlowCallOfASaveLetsNoCacheOfAnotherSaveAnswerForIt) {
   }
 }
 
-// The savers date their caches ahead, so that the date alone would let each of them count.
+// The savers date their caches ahead, so that the date alone would let each of them count; one
+// without a stamp, for which nothing but the date speaks, must not be there then.
 TEST_F(FaultsTest, TwoProcessesThatSaveToOneFileLeaveOneWholeDocumentAndAReaderReadsIt) {
   Prepare(kScenes[0]);
+  fs::remove(cache_);
   for (const Known* known : {&new_, &other_}) {
     if (fork() == 0) {
       for (int round = 0; round < 100; ++round) {
@@ -307,7 +309,7 @@ TEST_F(FaultsTest, TwoProcessesThatSaveToOneFileLeaveOneWholeDocumentAndAReaderR
     ASSERT_EQ(status, 0);
   }
   EXPECT_EQ(status, 0);
-  EXPECT_GT(compared, 100);
+  EXPECT_GT(compared, 10);
   for (const auto& entry : fs::recursive_directory_iterator(directory_ / "")) {
     EXPECT_NE(entry.path().extension(), ".tmp");
   }
