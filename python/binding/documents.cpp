@@ -263,7 +263,9 @@ void AddContainer(py::class_<Container, Owner<Container>>& type, const char* nam
       "rename",
       [](Container& self, const std::string& old_name, const std::string& new_name) {
         const LibraryLock lock;
-        return self.RenameElement(old_name, new_name);
+        const auto element = self.FindElement(old_name);
+        self.RenameElement(old_name, new_name);
+        return element->GetName();  // what is returned there may be one number further
       },
       "rename(self, old, new)\n--\n\nReturns the new name, with a number behind it if it was "
       "taken.",

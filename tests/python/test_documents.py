@@ -120,8 +120,10 @@ def test_names_stay_unique_and_elements_can_go() -> None:
     names = [samples.add_sample("red").name for _ in range(3)]
     assert names == ["red", "red (1)", "red (2)"]
     assert samples.rename("red (1)", "blue") == "blue"
+    samples.add_sample("red")
+    assert samples.rename("red (1)", "red") in samples  # the number that it gives up is free again
     del samples["red (2)"]
-    assert [s.name for s in samples] == ["red", "blue"]
+    assert [s.name for s in samples] == ["red", "blue", "red (1)"]
     samples["red"].set_header("Creator", "me")
     assert samples["red"].creator == "me"
     samples["red"].set_header("Creator", None)

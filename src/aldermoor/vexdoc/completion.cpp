@@ -20,11 +20,14 @@ using Texts = std::map<std::string, std::string>;
 using Counts = std::map<std::string, std::size_t>;
 
 // Legacy documents may say "Undefined" for a wavelength that they do not know.
-bool Names(const Conditions& conditions, const std::string& key) {
+bool IsValue(const std::string& key, const std::string& value) {
   const bool is_wavelength =
       key == ConditionKeys::kWavelengthMin || key == ConditionKeys::kWavelengthMax;
-  return conditions.HasAttribute(key) &&
-         (!is_wavelength || Internals::ReadWavelength(conditions.GetAttribute(key)));
+  return !is_wavelength || Internals::ReadWavelength(value);
+}
+
+bool Names(const Conditions& conditions, const std::string& key) {
+  return conditions.HasAttribute(key) && IsValue(key, conditions.GetAttribute(key));
 }
 
 // Returns those of the mandatory `keys` that are missing in the end.
@@ -35,7 +38,7 @@ std::vector<std::string> Fill(Conditions& conditions, const std::vector<std::str
     if (Names(conditions, key)) {
       continue;
     }
-    if (const auto found = given.find(key); found != given.end()) {
+    if (const auto found = given.find(key); found != given.end() && IsValue(key, found->second)) {
       conditions.AddAttribute(key, found->second);
       taken.push_back(key);
     } else {

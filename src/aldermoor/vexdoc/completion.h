@@ -21,7 +21,7 @@ ALDERMOOR_EXPORT bool IsConditionOfSpectra(std::string_view key);
 ALDERMOOR_EXPORT bool IsConditionOfColors(std::string_view key);
 
 /// Conditions, key to value, for what lacks them.  What a file does name is never replaced, but a
-/// wavelength that is no number counts as lacking.
+/// wavelength that is no number counts as lacking, there and here.
 struct Completion {
   std::map<std::string, std::string> spectra;
   std::map<std::string, std::string> colors;

@@ -98,8 +98,11 @@ CacheState StateOfCache(const File& xml) try {
   try {
     state.reason = cache.Find(Internals::XmlCache::Need::kExact).reason;
     const RegularFile file(path, RegularFile::Link::kRefuse);
+    const RegularFile document(xml.GetAbsolutePlatformName(), RegularFile::Link::kFollow);
     // Of what is not used anyway, damage is the reason that helps most.
-    const std::string fault = file.IsOpen() ? FirstError(View(file.Read())) : "";
+    const bool is_worth_reading =
+        file.IsOpen() && document.IsOpen() && !Internals::XmlCache::IsTooLong(file, document);
+    const std::string fault = is_worth_reading ? FirstError(View(file.Read())) : "";
     state.reason = fault.empty() ? state.reason : fault;
   } catch (const Utilities::Exceptions::ResourceNotAvailableException& e) {
     state.reason = e.what();

@@ -33,8 +33,9 @@ enum class WavelengthUse {
 struct LoadOptions {
   CacheUse cache = CacheUse::kRead;
   WavelengthUse wavelengths = WavelengthUse::kRefuse;
-  /// Asks for CompleteConditions, ahead of the look at the wavelengths.  Spectra that still lack a
-  /// range afterwards are told as such only.
+  /// Asks for CompleteConditions, ahead of the comparison of the wavelengths, but behind kComplete:
+  /// a range comes from the points first.  Spectra that still lack a range afterwards are told as
+  /// such only.  Reads the XML, not the cache.
   std::optional<Completion> completion = std::nullopt;
 };
 

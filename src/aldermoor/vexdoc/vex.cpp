@@ -2,6 +2,7 @@
 
 #include <filesystem>
 #include <istream>
+#include <new>
 #include <ostream>
 #include <stdexcept>
 
@@ -46,7 +47,9 @@ std::string LoadFromCache(VEX& document, const XmlCache& cache, XmlCache::Need n
     if (!found.IsUsable()) {
       return found.reason;
     }
-    GetBinaryProvider(document)->Read(found.GetBytes());
+    Internals::LoadRules rules;
+    rules.gives_dates = need == XmlCache::Need::kAny;
+    GetBinaryProvider(document)->Read(found.GetBytes(), rules);
   } catch (const std::exception& e) {
     return e.what();
   }
@@ -103,11 +106,10 @@ void WriteCacheOfSaved(const File& file, const Platform::Posix::ContentMark& wri
   try {
     File xml(file.GetAbsoluteName());
     reading = adapter.Load(xml);
-  } catch (const VexException&) {
-    cache.Remove();  // for text that a load refuses
-    return;
-  } catch (const ResourceNotAvailableException&) {
-    cache.Remove();  // for a file that its writer may not read
+  } catch (const std::bad_alloc&) {
+    throw;
+  } catch (const std::exception&) {
+    cache.Remove();  // for text that a load refuses, or a file that its writer may not read
     return;
   }
   if (reading.hash == written.hash && reading.state.size == written.size) {
@@ -175,15 +177,15 @@ ALDERMOOR_FRAME(Aldermoor::Vexdoc::VEX::LoadXML)
 LoadReport VEX::LoadXML(const File& file, const LoadOptions& options) try {
   LoadReport report;
   XmlCache cache(file);
-  // A cache does not hold the points of the file, from which a range is taken.
-  if (options.cache != CacheUse::kNone && options.wavelengths != WavelengthUse::kComplete) {
+  // A cache does not hold the points of the file, from which a range is taken, or with which a
+  // range that is given has to agree.
+  const bool needs_points =
+      options.wavelengths == WavelengthUse::kComplete || options.completion.has_value();
+  if (options.cache != CacheUse::kNone && !needs_points) {
     report.cache_reason = LoadFromCache(*this, cache, XmlCache::Need::kExact, options.cache);
     report.from_cache = report.cache_reason.empty();
   }
   if (report.from_cache) {
-    if (options.completion) {
-      report.completion = CompleteConditions(*this, *options.completion);
-    }
     return report;
   }
   Internals::XercesAdapter adapter(this);

@@ -87,6 +87,42 @@ TEST_F(CacheExactnessTest, WhatACarefulLoadCachesIsWhatItRead) {
   }
 }
 
+// A plain load knows nothing of a range that nobody named, and its cache nothing of the points.
+TEST_F(CacheExactnessTest, ARangeThatIsGivenHasToAgreeWithPointsThatACacheHasNot) {
+  std::string text = TextOf(kDates, "410");
+  for (const char* const end : {"Min'>400nm", "Max'>410nm"}) {
+    const auto at = text.find(std::string("<A N='Physical.WavelengthSpectrum") + end);
+    text.erase(at, text.find("</A>", at) + 4 - at);
+  }
+  text.erase(text.find(" Version='1.0'"), 14);
+  Write(text);
+  document_.LoadXML(File(xml_.string()), true);
+  LoadOptions options;
+  options.completion.emplace();
+  options.completion->spectra = {{"Physical.WavelengthSpectrumMin", "420nm"},
+                                 {"Physical.WavelengthSpectrumMax", "430nm"}};
+  EXPECT_THROW(Load(document_, options), WavelengthException);
+  options.completion->spectra["Physical.WavelengthSpectrumMin"] = "400nm";
+  options.completion->spectra["Physical.WavelengthSpectrumMax"] = "bogus";
+  EXPECT_EQ(Load(document_, options).completion.missing_count, 1U);
+  options.completion->spectra["Physical.WavelengthSpectrumMax"] = "410nm";
+  EXPECT_EQ(Load(document_, options).completion.missing_count, 0U);
+}
+
+TEST_F(CacheExactnessTest, ASaveOfWhatNoLoadReadsSucceedsWithoutACache) {
+  Write(TextOf(kDates, "410"));
+  document_.LoadXML(File(xml_.string()), true);
+  const auto spectrum = document_.FindSample("n", "n")->GetElements().front().second;
+  for (const char* const count : {"", "none", "99999999999", "35"}) {
+    Conditions conditions(*spectrum->GetConditions());
+    conditions.AddAttribute("Physical.NumberOfDataPointsSpectrum", count);
+    spectrum->SetConditions(SharedConditions(conditions));
+    File file(xml_.string());
+    EXPECT_NO_THROW(document_.SaveXML(file, true)) << count;
+    EXPECT_FALSE(fs::exists(cache_)) << count;
+  }
+}
+
 TEST_F(CacheExactnessTest, WhatWasCompletedIsNotCached) {
   Write(TextOf(kDates, "420"));
   Load(document_, {.cache = CacheUse::kReadAndWrite, .wavelengths = WavelengthUse::kComplete});

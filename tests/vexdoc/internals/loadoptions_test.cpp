@@ -118,6 +118,40 @@ TEST(LoadOptionsTest, WavelengthsOtherThanThoseOfTheConditionsAreRefusedOrTold) 
   }
 }
 
+// Their values would stand elsewhere; several of them may be read as one.
+TEST(LoadOptionsTest, WavelengthsThatSayOtherThanWhatIsReadAreRefusedAndNoRangeIsTakenFromThem) {
+  const std::pair<const char*, bool> texts[] = {
+      {"380.9", false}, {"379.99", false}, {"3.8e2", false}, {"0.38um", false}, {"380 um", false},
+      {"380.0", true},  {"380nm", true},   {" 380", true},   {"+380", true}};
+  for (const auto& [text, is_exact] : texts) {
+    for (const char* const version : {"", " Version='1.0'"}) {
+      const std::string value = std::string("<Value Name='") + text + "'>0.5</Value>";
+      const std::string spectrum = "<Spectrum Conditions='1'>" + value + "</Spectrum>";
+      const std::string read = std::to_string(std::stoul(text));
+      const std::string document_text =
+          std::string("<VEX") + version +
+          "><Name/><SampleSet><Name>S</Name><Sample><Name>x</Name>" + "<SampleAttribute>" +
+          spectrum +
+          "</SampleAttribute></Sample></SampleSet><Conditions><ID>1</ID>"
+          "<A N='Physical.NumberOfDataPointsSpectrum'>1</A><A N='Physical.SpectrumType'>Flash</A>"
+          "<A N='Physical.WavelengthSpectrumMin'>" +
+          read + "nm</A><A N='Physical.WavelengthSpectrumMax'>730nm</A></Conditions></VEX>";
+      for (const WavelengthUse use : {WavelengthUse::kRefuse, WavelengthUse::kComplete}) {
+        VEX document;
+        if (is_exact) {
+          EXPECT_NO_THROW(LoadWith(document, document_text, Use(use))) << text;
+        } else {
+          EXPECT_THROW(LoadWith(document, document_text, Use(use)), WavelengthException) << text;
+        }
+      }
+      VEX document;
+      EXPECT_EQ(LoadWith(document, document_text, Use(WavelengthUse::kReport)).contradiction_count,
+                is_exact ? 0U : 1U)
+          << text;
+    }
+  }
+}
+
 TEST(LoadOptionsTest, RangeIsTakenFromPointsWithOneStepAndSurvivesASave) {
   for (const Case& one : kCases) {
     VEX document;

@@ -139,6 +139,20 @@ TEST_F(SavedConditionsTest, AFileWithUnknownAttributesKeepsItsLinksThroughSaves)
   ExpectSaved(4);
 }
 
+// An application may assign to a block that the manager holds, which then has another ID too.
+TEST_F(SavedConditionsTest, ALoadLinksTheBlockThatWasFoundWhateverItsIdIs) {
+  const auto first = SharedConditions(With({{"k", "assigned: first"}}));
+  const auto second = SharedConditions(With({{"k", "assigned: second"}}));
+  Conditions changed(*second);
+  changed.AddAttribute("k", "assigned: third");
+  *first = changed;
+  Add(first);
+  const auto lost = SharedConditions(With({{"k", "assigned: lost"}}));
+  *lost = Conditions("no ID of the process", With({{"k", "assigned: lost"}}));
+  Add(lost);
+  ExpectSaved(2);
+}
+
 TEST_F(SavedConditionsTest, FailuresOfASaveNameTheSetAndTheSample) {
   const std::string place = "set 's', sample 't': ";
   const std::string internal = "An internal XML exception has occured while initializing XML:\n";

@@ -398,6 +398,12 @@ TEST_F(StaleCacheTest, CacheAndStampHaveThePermissionsOfTheXmlFile) {
     VEX().LoadXML(File(xml_.string()), true);
     EXPECT_EQ(fs::status(cache_).permissions(), fs::perms(mode));
     EXPECT_EQ(fs::status(stamp_).permissions(), fs::perms(mode));
+    // Narrowed later, they are those of the next cache.
+    const auto narrow = fs::perms(mode & 0400);
+    fs::permissions(xml_, narrow);
+    EXPECT_EQ(Load({.cache = CacheUse::kReadAndWrite}).from_cache, mode == 0400);
+    EXPECT_EQ(fs::status(cache_).permissions(), narrow);
+    EXPECT_EQ(fs::status(stamp_).permissions(), narrow);
   }
 }
 
@@ -519,6 +525,28 @@ TEST_F(StaleCacheTest, AFileWhoseNameStartsLikeADriveIsWrittenAndRead) {
     EXPECT_TRUE(fs::exists("Cache/" + std::string(name, 3) + ".vexb"));
   }
   fs::current_path(before);
+}
+
+// Of a file that anybody may have made as long as he liked, with nothing in it.
+TEST_F(StaleCacheTest, ACacheOfAnotherSizeIsNotRead) {
+  constexpr std::uintmax_t kLong = std::uintmax_t{1} << 40;
+  for (const StampState state : {StampState::kSettled, StampState::kNone}) {
+    Prepare("other", 200, state);
+    fs::resize_file(cache_, kLong);
+    fs::last_write_time(cache_, fs::file_time_type::clock::now() + std::chrono::seconds(10));
+    document_.LoadXML(File(xml_.string()), false);
+    EXPECT_EQ(document_.GetName(), "first");
+    EXPECT_FALSE(StateOfCache(File(xml_.string())).is_used);
+  }
+}
+
+TEST_F(StaleCacheTest, ANameThatLeavesNoRoomForThatOfAStampHasNoCache) {
+  const fs::path path = directory_ / (std::string(246, 'y') + ".xml");
+  File file(path.string());
+  EXPECT_NO_THROW(VEX("long").SaveXML(file, true));
+  document_.LoadXML(file, true);
+  EXPECT_EQ(document_.GetName(), "long");
+  EXPECT_FALSE(fs::exists(directory_ / "Cache"));
 }
 
 }  // namespace

@@ -54,7 +54,8 @@ std::string ReadRest(std::istream& in) {
 
 BinaryLoader::BinaryLoader(std::istream& in) : owned_(ReadRest(in)), bytes_left_(owned_) {}
 
-BinaryLoader::BinaryLoader(std::string_view bytes) : bytes_left_(bytes) {}
+BinaryLoader::BinaryLoader(std::string_view bytes, const LoadRules& rules)
+    : rules_(rules), bytes_left_(bytes) {}
 
 BinaryLoader::~BinaryLoader() = default;
 
@@ -121,8 +122,9 @@ void BinaryLoader::LoadSampleAttribute(Attribute& attribute) {
 }
 
 void BinaryLoader::LoadHeader(Header& header) try {
-  // The file has all of them; what the constructor has put in is of the time of this load.
-  DocumentAccess::ClearAttributes(header);
+  if (!rules_.gives_dates) {
+    DocumentAccess::ClearAttributes(header);  // the constructor has put in the present
+  }
   for (std::uint32_t count = ReadNumber(); count > 0; --count) {
     const std::string key = ReadString();
     header.SetAttribute(key, ReadString());
@@ -205,7 +207,7 @@ void BinaryLoader::LoadConditions() try {
       LoadCustomIllumination(conditions);
     }
     condition_links_[id] =
-        ConditionManager::GetInstance().GetOrCreateConditions(std::move(conditions))->GetID();
+        ConditionManager::GetInstance().GetOrCreateConditions(std::move(conditions));
   }
 }
 ALDERMOOR_FRAME(Aldermoor::Vexdoc::Internals::BinaryLoader::LoadConditions)
@@ -227,8 +229,7 @@ void BinaryLoader::RelinkConditions(VEX& vex) try {
               Filled("Condition(ID=<%NAME%>) not found", "%NAME%", id),
               ALDERMOOR_HERE(Aldermoor::Vexdoc::Internals::BinaryLoader::RelinkConditions));
         }
-        attribute.second->SetConditions(
-            ConditionManager::GetInstance().GetConditions(link->second));
+        attribute.second->SetConditions(link->second);
       }
     }
   }

@@ -13,6 +13,7 @@
 #include "aldermoor/utilities/tools/smartpointer.h"
 #include "aldermoor/vexdoc/dataitem.h"
 #include "aldermoor/vexdoc/elementvisitor.h"
+#include "aldermoor/vexdoc/internals/loadnotes.h"
 #include "aldermoor/vexdoc/vex.h"
 
 namespace Aldermoor::Vexdoc::Internals {
@@ -30,7 +31,7 @@ class BinaryLoader : public ElementVisitor {
   /// Reads `in` to its end at once.  Nothing is read from one without positions, such as a pipe.
   explicit BinaryLoader(std::istream& in);
   /// `bytes` must outlive this object.
-  explicit BinaryLoader(std::string_view bytes);
+  explicit BinaryLoader(std::string_view bytes, const LoadRules& rules = {});
   ~BinaryLoader() override;
 
   Utilities::Tools::SmartPointer<VEX> Load();
@@ -70,9 +71,11 @@ class BinaryLoader : public ElementVisitor {
   // Takes `count` bytes from the front of what is left; null if there are fewer.
   const char* Take(std::size_t count);
 
-  std::map<std::string, std::string> condition_links_;  // ID in the file to ID in the manager
-  std::string owned_;                                   // of a stream
-  std::string_view bytes_left_;                         // of the file
+  LoadRules rules_;
+  // From the IDs of the file, to the blocks themselves as in XMLLoader.
+  std::map<std::string, Utilities::Tools::SmartPointer<Conditions>> condition_links_;
+  std::string owned_;            // of a stream
+  std::string_view bytes_left_;  // of the file
   unsigned int tree_depth_ = 0;
   // Colours in the order of the file, whose constructor needs the real conditions.
   std::vector<std::pair<ColorVector*, Channels>> pending_colors_;

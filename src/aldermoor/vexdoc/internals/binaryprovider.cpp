@@ -26,12 +26,12 @@ void BinaryProvider::Read(File& file) try {
                        ALDERMOOR_HERE(Aldermoor::Vexdoc::Internals::BinaryProvider::Read));
   }
   const std::vector<char> bytes = opened.Read();
-  Read({bytes.data(), bytes.size()});
+  Read({bytes.data(), bytes.size()}, LoadRules());
 }
 ALDERMOOR_FRAME(Aldermoor::Vexdoc::Internals::BinaryProvider::Read)
 
-void BinaryProvider::Read(std::string_view bytes) try {
-  const auto loaded = BinaryLoader(bytes).Load();
+void BinaryProvider::Read(std::string_view bytes, const LoadRules& rules) try {
+  const auto loaded = BinaryLoader(bytes, rules).Load();
   DocumentAccess::Swap(*document_, *loaded);
 }
 ALDERMOOR_FRAME(Aldermoor::Vexdoc::Internals::BinaryProvider::Read)

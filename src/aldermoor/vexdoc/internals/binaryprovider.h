@@ -7,6 +7,7 @@
 
 #include "aldermoor/utilities/filesystem/file.h"
 #include "aldermoor/utilities/filesystem/posix/filereplacement.h"
+#include "aldermoor/vexdoc/internals/loadnotes.h"
 #include "aldermoor/vexdoc/vex.h"
 
 namespace Aldermoor::Vexdoc::Internals {
@@ -27,7 +28,7 @@ class BinaryProvider {
   virtual void Write(Utilities::FileSystem::File& file);
 
   /// The same from the bytes of a cache.
-  void Read(std::string_view bytes);
+  void Read(std::string_view bytes, const LoadRules& rules);
   /// Writes to a file that belongs to the one of which `owner` is the status; whatever bears its
   /// name is replaced itself.  Returns the mark of the bytes written.
   Platform::Posix::ContentMark Write(Utilities::FileSystem::File& file, const struct stat& owner);

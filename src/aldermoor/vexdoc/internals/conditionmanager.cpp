@@ -5,7 +5,7 @@
 
 #include "aldermoor/utilities/exceptions/exceptions.h"
 #include "aldermoor/utilities/exceptions/frame.h"
-#include "aldermoor/vexdoc/internals/conditionhash.h"
+#include "aldermoor/vexdoc/internals/conditioncontent.h"
 #include "aldermoor/vexdoc/spectrum.h"
 
 namespace Aldermoor::Vexdoc::Internals {
@@ -17,6 +17,12 @@ namespace {
 
 // A walk over fewer blocks costs less than a hash of the attributes.
 constexpr std::size_t kFewBlocks = 16;
+
+// An application may hold a curve without conditions, which cannot be compared.
+bool HasComparableCurve(const Conditions& conditions) {
+  return !conditions.HasCustomIllumination() ||
+         !conditions.GetCustomIllumination().GetConditions().IsNull();
+}
 
 }  // namespace
 
@@ -30,7 +36,7 @@ ConditionManager::Block ConditionManager::Store(const Block& block) {
   const auto entry = conditions_.emplace(block->GetID(), block).first;
   if (!is_index_stale_) {
     is_index_stale_ = true;  // should the next line fail
-    index_.emplace(HashOf(block->GetAttributes()), entry);
+    index_.emplace(HashOf(*block), entry);
     is_index_stale_ = false;
   }
   return block;
@@ -43,8 +49,13 @@ ConditionManager::Block ConditionManager::GetOrCreateConditions(const Conditions
 ALDERMOOR_FRAME(Aldermoor::Vexdoc::Internals::ConditionManager::GetOrCreateConditions)
 
 ConditionManager::Block ConditionManager::GetOrCreateConditions(Conditions&& conditions) try {
-  if (const Block block = FindEqual(conditions)) {
-    return block;
+  // Also in a curve to which the attributes do not refer: what a file gives may not depend on what
+  // was read before it.
+  const Block found = FindFirst(conditions, [&conditions](const Conditions& block) {
+    return HaveEqualContent(block, conditions) && HasComparableCurve(block) && block == conditions;
+  });
+  if (found) {
+    return found;
   }
   const Block block(new Conditions(GetNextUniqueID()));
   block->attributes_.swap(conditions.attributes_);
@@ -66,13 +77,12 @@ ConditionManager::Block ConditionManager::FindConditions(
 ALDERMOOR_FRAME(Aldermoor::Vexdoc::Internals::ConditionManager::FindConditions)
 
 ConditionManager::Block ConditionManager::FindEqual(const Conditions& conditions) {
-  return FindFirst(conditions.GetAttributes(),
+  return FindFirst(conditions,
                    [&conditions](const Conditions& block) { return block == conditions; });
 }
 
-template <class Attributes, class Predicate>
-ConditionManager::Block ConditionManager::FindFirst(const Attributes& attributes,
-                                                    Predicate is_wanted) {
+template <class Content, class Predicate>
+ConditionManager::Block ConditionManager::FindFirst(const Content& content, Predicate is_wanted) {
   if (conditions_.size() <= kFewBlocks) {
     for (const auto& [id, block] : conditions_) {
       if (is_wanted(*block)) {
@@ -84,7 +94,7 @@ ConditionManager::Block ConditionManager::FindFirst(const Attributes& attributes
   // A file with very many blocks must not cost the square of their number.
   UpdateIndex();
   auto first = conditions_.cend();
-  const auto [begin, end] = index_.equal_range(HashOf(attributes));
+  const auto [begin, end] = index_.equal_range(HashOf(content));
   for (auto candidate = begin; candidate != end; ++candidate) {
     const auto entry = candidate->second;
     if (is_wanted(*entry->second) && (first == conditions_.cend() || entry->first < first->first)) {
@@ -102,7 +112,7 @@ void ConditionManager::UpdateIndex() {
   is_index_stale_ = true;
   index_.clear();
   for (auto entry = conditions_.cbegin(); entry != conditions_.cend(); ++entry) {
-    index_.emplace(HashOf(entry->second->GetAttributes()), entry);
+    index_.emplace(HashOf(*entry->second), entry);
   }
   indexed_changes_ = Conditions::changes_of_shared_;
   is_index_stale_ = false;

@@ -28,7 +28,8 @@ class ConditionManager final : public Utilities::Patterns::Singleton<ConditionMa
   virtual Block AddConditions(const Conditions& conditions);
   /// The first block in the order of the IDs' texts that equals `conditions`, else a new one.
   virtual Block GetOrCreateConditions(const Conditions& conditions);
-  /// The same, but a new block takes the content over: one that was read from a file can be big.
+  /// The same for what was read from a file, but the block has all of its content, a curve to which
+  /// the attributes do not refer included; a new one takes it over, since it can be big.
   Block GetOrCreateConditions(Conditions&& conditions);
   /// The first block with exactly these attributes, in ascending order of their keys, and without
   /// a custom illumination; empty if there is none.
@@ -53,8 +54,8 @@ class ConditionManager final : public Utilities::Patterns::Singleton<ConditionMa
 
   Block Store(const Block& block);
   std::string GetNextUniqueID();
-  template <class Attributes, class Predicate>
-  Block FindFirst(const Attributes& attributes, Predicate is_wanted);
+  template <class Content, class Predicate>
+  Block FindFirst(const Content& content, Predicate is_wanted);
   Block FindEqual(const Conditions& conditions);
   void UpdateIndex();
   void DropIndex();

@@ -1,12 +1,9 @@
 #include "aldermoor/vexdoc/internals/conditiontable.h"
 
 #include <algorithm>
-#include <cstring>
-#include <vector>
 
-#include "aldermoor/vexdoc/internals/conditionhash.h"
+#include "aldermoor/vexdoc/internals/conditioncontent.h"
 #include "aldermoor/vexdoc/internals/conditionmanager.h"
-#include "aldermoor/vexdoc/spectrum.h"
 
 namespace Aldermoor::Vexdoc::Internals {
 
@@ -16,23 +13,6 @@ namespace {
 bool IsUsable(const std::string& id) {
   return !id.empty() && id != "0" &&
          std::all_of(id.begin(), id.end(), [](char c) { return c > ' ' && c <= '~'; });
-}
-
-bool HaveEqualBits(const std::vector<float>& first, const std::vector<float>& second) {
-  return first.size() == second.size() &&
-         (first.empty() ||
-          std::memcmp(first.data(), second.data(), first.size() * sizeof(float)) == 0);
-}
-
-// All that a file holds of a block, and to the bit: unlike the equality of conditions, which passes
-// over a curve to which the attributes do not refer.
-bool HaveEqualContent(const Conditions& first, const Conditions& second) {
-  if (first.GetAttributes() != second.GetAttributes() ||
-      first.HasCustomIllumination() != second.HasCustomIllumination()) {
-    return false;
-  }
-  return !first.HasCustomIllumination() || HaveEqualBits(first.GetCustomIllumination().GetData(),
-                                                         second.GetCustomIllumination().GetData());
 }
 
 }  // namespace
@@ -60,7 +40,7 @@ ConditionTable::Entry ConditionTable::Find(const Conditions& block) {
 }
 
 ConditionTable::Entry ConditionTable::FindEqual(const Conditions& block) const {
-  const auto [begin, end] = by_content_.equal_range(HashOf(block.GetAttributes()));
+  const auto [begin, end] = by_content_.equal_range(HashOfContent(block));
   const auto found = std::find_if(begin, end, [&block](const auto& candidate) {
     return HaveEqualContent(*candidate.second->second, block);
   });
@@ -70,7 +50,7 @@ ConditionTable::Entry ConditionTable::FindEqual(const Conditions& block) const {
 ConditionTable::Entry ConditionTable::Add(const std::string& id, const Conditions& block) {
   const Entry entry = blocks_.emplace(id, &block).first;
   entries_.emplace(&block, entry);
-  by_content_.emplace(HashOf(block.GetAttributes()), entry);
+  by_content_.emplace(HashOfContent(block), entry);
   return entry;
 }
 

@@ -287,14 +287,6 @@ void DocumentChecker::CheckIllumination(const Conditions& block) {
   if (!curve.empty()) {
     CheckSteps(" of the illumination", block, curve.size());
   }
-  if (block.RefersToCustomIllumination()) {
-    return;
-  }
-  const auto [other, is_new] = with_idle_curve_.emplace(block.GetAttributes(), &block);
-  if (!is_new && other->second->GetCustomIllumination().GetData() != curve) {
-    Add("the conditions differ from others in nothing but an illumination to which they do not "
-        "refer; the two come back as one");
-  }
 }
 
 void DocumentChecker::CheckRange(const Conditions& conditions) {
@@ -318,11 +310,10 @@ void DocumentChecker::CheckSteps(const std::string& whose, const Conditions& con
                              Quoted(conditions.GetAttribute(ConditionKeys::kWavelengthMax, "730"));
   try {
     const WavelengthSteps steps(conditions, points);
-    const std::int64_t last = steps.first + steps.step * (static_cast<std::int64_t>(points) - 1);
     if (points > 1 && steps.step <= 0) {
       Add(values + " would get equal or falling wavelengths: the step is in whole nm");
-    } else if (steps.first < 0 && last >= 0) {
-      Add(values + " would come back in another order: wavelengths are written without a sign");
+    } else if (steps.first < 0) {
+      Add(values + " would come back at other wavelengths: they are written without a sign");
     }
   } catch (const std::invalid_argument&) {
     Add(values + ", which are no whole wavelengths");

@@ -59,8 +59,6 @@ class DocumentChecker : public ElementVisitor {
   unsigned int index_ = 0;  // of the attribute in its sample, from 1
   std::set<std::string, std::less<>> names_;
   std::set<const Conditions*> blocks_;
-  // Blocks with a curve to which they do not refer: equal conditions, whatever the curve.
-  std::map<std::map<std::string, std::string>, const Conditions*> with_idle_curve_;
   std::vector<DocumentFault> faults_;
   XMLChText text_;
 };

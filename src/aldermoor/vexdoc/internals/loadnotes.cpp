@@ -57,19 +57,25 @@ std::string RangeText(const Wavelengths& points) {
 
 }  // namespace
 
-void LoadNotes::AddSpectrum(const Spectrum& spectrum, Wavelengths points) {
-  if (last_ == nullptr || *last_ != points) {
-    last_ = &*rulers_.insert(std::move(points)).first;
+void LoadNotes::AddSpectrum(const Spectrum& spectrum, Ruler ruler) {
+  if (!ruler.misread.empty()) {
+    misread_.emplace(&spectrum, std::move(ruler.misread));
+  }
+  if (last_ == nullptr || *last_ != ruler.points) {
+    last_ = &*rulers_.insert(std::move(ruler.points)).first;
   }
   points_.emplace(&spectrum, last_);
 }
 
-void LoadNotes::AddIllumination(const std::string& id, const Wavelengths& points,
+void LoadNotes::AddIllumination(const std::string& id, const Ruler& ruler,
                                 const Conditions& conditions) {
-  if (!AreOfIllumination(points, conditions)) {
-    illuminations_.push_back({"", "",
-                              "the illuminant of the conditions " + Quoted(id) + ": " +
-                                  ContradictionText(points, CustomIlluminationConditions())});
+  if (!ruler.misread.empty() || !AreOfIllumination(ruler.points, conditions)) {
+    illuminations_.push_back(
+        {"", "",
+         "the illuminant of the conditions " + Quoted(id) + ": " +
+             (ruler.misread.empty()
+                  ? ContradictionText(ruler.points, CustomIlluminationConditions())
+                  : ruler.misread)});
   }
 }
 
@@ -87,7 +93,7 @@ void LoadNotes::ForEachSpectrum(const VEX& document, Visit visit) const {
 }
 
 bool LoadNotes::IsExact(const VEX& document) const {
-  if (gave_dates_ || !illuminations_.empty()) {
+  if (gave_dates_ || !illuminations_.empty() || !misread_.empty()) {
     return false;
   }
   bool is_exact = true;
@@ -121,7 +127,7 @@ void LoadNotes::TakeRanges(const VEX& document, LoadReport& report) const {
   ForEachSpectrum(document, [&](const auto&, const auto&, SampleAttribute& spectrum,
                                 const Wavelengths& points) {
     const Conditions& told = *spectrum.GetConditions();
-    if (!AreRegular(points) ||
+    if (!AreRegular(points) || misread_.contains(&spectrum) ||
         (NamesRange(told) && NamesCount(told, points.size()) && agreement.Of(points, told))) {
       return;
     }
@@ -139,10 +145,17 @@ void LoadNotes::FindContradictions(const VEX& document, const LoadOptions& optio
   ForEachSpectrum(document, [&](const SampleSet& set, const Sample& sample,
                                 const SampleAttribute& spectrum, const Wavelengths& points) {
     const Conditions& conditions = *spectrum.GetConditions();
-    if (agreement.Of(points, conditions) || (options.completion && !NamesRange(conditions))) {
+    const auto misread = misread_.find(&spectrum);
+    if (misread == misread_.end() &&
+        (agreement.Of(points, conditions) || (options.completion && !NamesRange(conditions)))) {
       return;
     }
-    if (++report.contradiction_count <= LoadReport::kMostListed) {
+    if (++report.contradiction_count > LoadReport::kMostListed) {
+      return;
+    }
+    if (misread != misread_.end()) {
+      report.contradictions.push_back({set.GetName(), sample.GetName(), misread->second});
+    } else {
       report.contradictions.push_back(
           {set.GetName(), sample.GetName(),
            ContradictionText(points, conditions) +

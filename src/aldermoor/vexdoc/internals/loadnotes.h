@@ -23,10 +23,9 @@ struct LoadRules {
 /// What a loader noticed and the document does not hold.
 class LoadNotes {
  public:
-  void AddSpectrum(const Spectrum& spectrum, Wavelengths points);
+  void AddSpectrum(const Spectrum& spectrum, Ruler ruler);
   /// `conditions` are those of the block that holds the illuminant.
-  void AddIllumination(const std::string& id, const Wavelengths& points,
-                       const Conditions& conditions);
+  void AddIllumination(const std::string& id, const Ruler& ruler, const Conditions& conditions);
   void AddGivenDate() { gave_dates_ = true; }
 
   /// Whether a document that was read so says what its file says: no wavelengths other than those
@@ -48,6 +47,7 @@ class LoadNotes {
   std::set<Wavelengths> rulers_;  // the few that are different
   std::unordered_map<const SampleAttribute*, const Wavelengths*> points_;
   const Wavelengths* last_ = nullptr;
+  std::unordered_map<const SampleAttribute*, std::string> misread_;
   std::vector<LoadReport::Contradiction> illuminations_;
   bool gave_dates_ = false;
 };

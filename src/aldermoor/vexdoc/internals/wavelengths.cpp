@@ -33,7 +33,7 @@ std::string PointsText(const Wavelengths& points) {
       continue;
     }
     text += i == 0 ? " at " : is_last && i > kShownInFront ? " ... " : ", ";
-    text += std::to_string(points[i]);
+    text += std::to_string(static_cast<std::int32_t>(points[i]));  // as the file had it
   }
   return points.empty() ? text : text + " nm";
 }
@@ -56,11 +56,15 @@ std::optional<std::int16_t> ReadWavelength(const std::string& text) {
 }
 
 bool IsWavelengthMisread(const std::string& text) {
-  if (!ReadWavelength(text)) {
-    return false;  // it is not read at all
-  }
+  return ReadWavelength(text) && SaysOtherThanItsNumber(text);
+}
+
+bool SaysOtherThanItsNumber(const std::string& text) {
   const std::size_t digits = text.find_first_of("0123456789");
   std::size_t rest = text.find_first_not_of("0123456789", digits);
+  if (rest != std::string::npos && text[rest] == '.') {
+    rest = text.find_first_not_of('0', rest + 1);
+  }
   rest = rest == std::string::npos ? rest : text.find_first_not_of(kBlanks, rest);
   if (rest == std::string::npos) {
     return false;

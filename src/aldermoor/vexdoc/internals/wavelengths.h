@@ -15,11 +15,22 @@ namespace Aldermoor::Vexdoc::Internals {
 /// Different wavelengths of one spectrum, nm, ascending.
 using Wavelengths = std::vector<unsigned int>;
 
+/// The wavelengths of one spectrum as a file has them.
+struct Ruler {
+  Wavelengths points;
+  /// The first whose text says something else than its number, in words; empty if there is none.
+  std::string misread;
+};
+
 /// The whole number of nm at the beginning of a condition such as "380nm", -32768 to 32767, with or
 /// without blanks, sign and zeros in front; nothing if there is none.
 std::optional<std::int16_t> ReadWavelength(const std::string& text);
 
-/// Whether `text` says something else than the number that is read from it: "400.5nm", "4e2".
+/// Whether `text`, which begins with a whole number, says something else than that: "400.5nm",
+/// "4e2". "400.0 nm" does not.
+bool SaysOtherThanItsNumber(const std::string& text);
+
+/// The same of a condition, and whether a number is read from it at all.
 bool IsWavelengthMisread(const std::string& text);
 
 /// Whether `points` are those that a save would write for as many values under `conditions`: from

@@ -2,6 +2,7 @@
 
 #include <algorithm>
 #include <cerrno>
+#include <climits>
 #include <filesystem>
 #include <system_error>
 
@@ -32,7 +33,9 @@ constexpr const char* kNotLater = "not later than the document by whole seconds"
 constexpr const char* kNoStamp = "it has no stamp that ties it to the document";
 constexpr const char* kNoStampAndOld =
     "it has no stamp, and the document has changed or come to its place since";
+constexpr const char* kTooLong = "it is too long for a cache of the document";
 constexpr const char* kNoGoodStamp = "its stamp is unfinished or damaged";
+constexpr const char* kOpenToMore = "it may be read by others than the document";
 constexpr const char* kNotExact = "it does not hold exactly what the document says";
 constexpr const char* kOtherBytes = "its bytes are not those that its stamp names";
 constexpr const char* kOtherContent = "it belongs to another content of the document";
@@ -105,6 +108,11 @@ XmlCache::Found XmlCache::Find(Need need) const try {
   if (!IsLater(cache.GetStatus(), xml.GetStatus().st_mtim)) {
     return Unusable(kNotLater);
   }
+  // The rights of the document may have been narrowed since; a cache that is written then has them.
+  constexpr mode_t kRights = S_IRWXU | S_IRWXG | S_IRWXO;
+  if ((cache.GetStatus().st_mode & ~xml.GetStatus().st_mode & kRights) != 0) {
+    return Unusable(kOpenToMore);
+  }
   const RegularFile stamp_file(stamp_path_, Link::kRefuse);
   Found found;
   if (stamp_file.GetError() == ENOENT) {
@@ -113,6 +121,9 @@ XmlCache::Found XmlCache::Find(Need need) const try {
     }
     if (need == Need::kExact) {
       return Unusable(kNoStamp);
+    }
+    if (IsTooLong(cache, xml)) {
+      return Unusable(kTooLong);
     }
     found.bytes = cache.Read();
     return found;
@@ -127,6 +138,9 @@ XmlCache::Found XmlCache::Find(Need need) const try {
   if (need == Need::kExact && !stamp->is_exact) {
     return Unusable(kNotExact);
   }
+  if (static_cast<std::uint64_t>(cache.GetStatus().st_size) != stamp->cache.size) {
+    return Unusable(kOtherBytes);  // without a look at what may be any number of bytes
+  }
   found.bytes = cache.Read();
   const Platform::Posix::ContentMark mark{
       found.bytes.size(), Platform::Posix::HashOf(found.bytes.data(), found.bytes.size())};
@@ -136,6 +150,13 @@ XmlCache::Found XmlCache::Find(Need need) const try {
   return IsStamped(xml, now, *stamp, found) ? found : Unusable(kOtherContent);
 }
 ALDERMOOR_FRAME(Aldermoor::Vexdoc::Internals::XmlCache::Find)
+
+bool XmlCache::IsTooLong(const RegularFile& cache, const RegularFile& xml) {
+  // Elements without text take four bytes in XML and up to 17 in a cache.
+  constexpr off_t kMostPerByte = 16;
+  constexpr off_t kAnyway = 4096;
+  return cache.GetStatus().st_size > kMostPerByte * xml.GetStatus().st_size + kAnyway;
+}
 
 // As git does with its index: times that agree and are settled need no look at the bytes.
 bool XmlCache::IsStamped(const RegularFile& xml, std::int64_t now, const CacheStamp& stamp,
@@ -188,6 +209,10 @@ void XmlCache::Write(VEX& document, const XmlReading& reading, bool is_exact) tr
   const RegularFile xml(xml_path_, Link::kFollow);
   if (!xml.IsOpen()) {
     return;  // beside a device there is no place for a cache
+  }
+  if (FileSystem::LastComponent(stamp_path_).size() > NAME_MAX) {
+    Remove();
+    return;  // nor for a stamp, without which a new cache does not count
   }
   FileSystem::Directory(FileSystem::Directory::Named, DirectoryOf(xml_path_))
       .CreateSubdir(kCacheDirectory);

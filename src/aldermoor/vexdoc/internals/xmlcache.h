@@ -43,6 +43,10 @@ class XmlCache {
 
   Utilities::FileSystem::File& GetFile() { return cache_; }
 
+  /// Whether a file is longer than any cache of that document.
+  static bool IsTooLong(const Platform::Posix::RegularFile& cache,
+                        const Platform::Posix::RegularFile& xml);
+
   /// Throws: ResourceNotAvailableException for a file that cannot be read.
   Found Find(Need need) const;
 

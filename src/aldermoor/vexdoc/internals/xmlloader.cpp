@@ -15,6 +15,7 @@
 #include "aldermoor/vexdoc/internals/customillumination.h"
 #include "aldermoor/vexdoc/internals/documentaccess.h"
 #include "aldermoor/vexdoc/internals/elementfactory.h"
+#include "aldermoor/vexdoc/internals/faulttext.h"
 #include "aldermoor/vexdoc/internals/xerceshelper.h"
 #include "aldermoor/vexdoc/internals/xmlnames.h"
 #include "aldermoor/vexdoc/recipe.h"
@@ -59,15 +60,34 @@ void ForEachValue(const NodeHolder& parent, Visit visit) {
 }
 
 struct Points {
-  Wavelengths wavelengths;
+  Ruler ruler;
   std::vector<float> values;
 };
+
+// What `text` says beyond the whole number that is read from it.
+std::string MisreadText(const XMLCh* text, unsigned int number) {
+  const XMLCh* c = text;
+  while (*c >= u'0' && *c <= u'9') {
+    ++c;
+  }
+  if (*c == 0) {
+    return "";  // all of it are digits, as nearly always
+  }
+  const std::string native = ToNativeString(text);
+  return SaysOtherThanItsNumber(native)
+             ? "the wavelength " + Quoted(native) + " is read as " + std::to_string(number)
+             : "";
+}
 
 // The points of a spectrum in ascending order of wavelength; of equal wavelengths the first counts.
 Points PointsByWavelength(const NodeHolder& holder) {
   std::vector<std::pair<unsigned int, float>> points;
-  ForEachValue(holder, [&points](const XMLCh* wavelength, const NodeHolder& value) {
+  Points sorted;
+  ForEachValue(holder, [&](const XMLCh* wavelength, const NodeHolder& value) {
     points.emplace_back(ReadUnsigned(wavelength), value.GetFloat());
+    if (sorted.ruler.misread.empty()) {
+      sorted.ruler.misread = MisreadText(wavelength, points.back().first);
+    }
   });
   const auto by_wavelength = [](const auto& a, const auto& b) {
     return a.first < b.first;
@@ -79,11 +99,10 @@ Points PointsByWavelength(const NodeHolder& holder) {
     return a.first == b.first;
   };
   points.erase(std::unique(points.begin(), points.end(), same_wavelength), points.end());
-  Points sorted;
-  sorted.wavelengths.reserve(points.size());
+  sorted.ruler.points.reserve(points.size());
   sorted.values.reserve(points.size());
   for (const auto& [wavelength, value] : points) {
-    sorted.wavelengths.push_back(wavelength);
+    sorted.ruler.points.push_back(wavelength);
     sorted.values.push_back(value);
   }
   return sorted;
@@ -157,8 +176,10 @@ void XMLLoader::LoadSampleAttribute(Attribute& attribute) {
         ALDERMOOR_HERE(Aldermoor::Vexdoc::Internals::XMLLoader::LoadSampleAttribute));
   }
   const auto known = condition_links_.find(ToNativeString(link));
-  const std::string id = known == condition_links_.end() ? "" : known->second;
-  attribute.SetConditions(ConditionManager::GetInstance().GetConditions(id));
+  // No block has an empty ID, which is how the failure shows it.
+  attribute.SetConditions(known == condition_links_.end()
+                              ? ConditionManager::GetInstance().GetConditions("")
+                              : known->second);
   HeaderParser(current_, attribute, true);
   LoadMembers(attribute);
 }
@@ -217,12 +238,12 @@ void XMLLoader::ConditionParser(NodeHolder& block) try {
     conditions.SetCustomIllumination(Spectrum(own, data));
   }
   condition_links_[id.GetText()] =
-      ConditionManager::GetInstance().GetOrCreateConditions(std::move(conditions))->GetID();
+      ConditionManager::GetInstance().GetOrCreateConditions(std::move(conditions));
 }
 ALDERMOOR_FRAME(Aldermoor::Vexdoc::Internals::XMLLoader::ConditionParser)
 
-Wavelengths XMLLoader::SpectrumVectorParser(NodeHolder& holder, const Conditions& conditions,
-                                            std::vector<float>& out) try {
+Ruler XMLLoader::SpectrumVectorParser(NodeHolder& holder, const Conditions& conditions,
+                                      std::vector<float>& out) try {
   const auto expected = Utilities::Tools::lexical_cast<unsigned int>(
       conditions.GetAttribute(ConditionKeys::kPointCount, "36"));
   Points points = PointsByWavelength(holder);
@@ -232,13 +253,13 @@ Wavelengths XMLLoader::SpectrumVectorParser(NodeHolder& holder, const Conditions
         ALDERMOOR_HERE(Aldermoor::Vexdoc::Internals::XMLLoader::SpectrumVectorParser));
   }
   out.swap(points.values);
-  return std::move(points.wavelengths);
+  return std::move(points.ruler);
 }
 ALDERMOOR_FRAME(Aldermoor::Vexdoc::Internals::XMLLoader::SpectrumVectorParser)
 
 std::vector<float> XMLLoader::ReadSpectrumValues(const Spectrum& spectrum) {
   Points points = PointsByWavelength(current_);
-  notes_.AddSpectrum(spectrum, std::move(points.wavelengths));
+  notes_.AddSpectrum(spectrum, std::move(points.ruler));
   return std::move(points.values);
 }
 

@@ -52,8 +52,8 @@ class XMLLoader : public ElementVisitor {
 
   /// The values of the "Value" children in ascending order of wavelength, and those; of equal
   /// wavelengths the first counts.
-  Wavelengths SpectrumVectorParser(NodeHolder& holder, const Conditions& conditions,
-                                   std::vector<float>& out);
+  Ruler SpectrumVectorParser(NodeHolder& holder, const Conditions& conditions,
+                             std::vector<float>& out);
   Utilities::Tools::SmartPointer<DataTree> VEXDataTreeParser(const NodeHolder& holder);
 
   /// The values of `spectrum`, which is the current node, however many there are.
@@ -69,7 +69,9 @@ class XMLLoader : public ElementVisitor {
 
   LoadRules rules_;
   LoadNotes notes_;
-  std::map<std::string, std::string> condition_links_;  // ID in the file to ID in the manager
+  // From the IDs of the file.  To the blocks themselves: what an application has assigned to a
+  // block may have given it another ID than that under which the manager keeps it.
+  std::map<std::string, Utilities::Tools::SmartPointer<Conditions>> condition_links_;
   NodeHolder current_;
 };
 
