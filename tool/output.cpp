@@ -26,6 +26,16 @@ unsigned int DefaultMode() {
   return 0666U & ~static_cast<unsigned int>(mask);
 }
 
+// Where a link leads, or several one after the other, though nothing is there yet.
+std::string EndOfLinks(std::filesystem::path path) {
+  constexpr int kMostLinks = 40;
+  std::error_code none;
+  for (int i = 0; i < kMostLinks && std::filesystem::is_symlink(path, none); ++i) {
+    path = path.parent_path() / std::filesystem::read_symlink(path, none);
+  }
+  return path.string();
+}
+
 }  // namespace
 
 void ReportReplacedInput(const std::string& path) {
@@ -81,6 +91,7 @@ void Output::Open(const std::string& path) {
     if (errno != ENOENT) {
       Fail(errno);
     }
+    target_ = EndOfLinks(path);
     OpenTemporary(DefaultMode());
   } else if (S_ISREG(status.st_mode)) {
     // A link stays a link: what it points to is replaced.

@@ -49,6 +49,10 @@ TEST_F(OutputTest, FileIsReplacedWholeOrNotAtAll) {
   EXPECT_EQ(ReadFile("old.csv"), Run("color a.xml --format=csv").out);
   EXPECT_EQ(Shell("test -L link.csv && stat -c %a old.csv").out, "640\n");
   EXPECT_EQ(Shell("LC_ALL=C ls -A").out, "a.xml\nbroken.xml\nlink.csv\nold.csv\n");
+  EXPECT_EQ(Shell("ln -s new.csv far && ln -s far near").status, 0);
+  EXPECT_EQ(Run("color a.xml -o near --format csv").status, 0);
+  EXPECT_EQ(Shell("test -L near && test -L far && cmp new.csv old.csv").status, 0)
+      << "links stay although nothing was there yet";
 }
 
 TEST_F(OutputTest, FailingOutputIsAnError) {
