@@ -51,9 +51,9 @@ std::vector<float> Values(const HXColorVector& color) {
 TEST(WeightsTest, BelongToTheLampThatIsAskedAlsoBehindAFailure) {
   const HXSpectrum sample = Slope(0.1F, 0.02F);
   const std::vector<HXMeasureConditions> lamps = {
-      Under("A", "TwoDegree"), Under("F11", "TwoDegree"), Under("A", "TenDegree"),
-      Under("Dxx, Temperature:6500", "TwoDegree"),        Under("", "TwoDegree"),
-      Under("", "TwoDegree"),  // another curve object
+      Under("A", "TwoDegree"),       Under("F11", "TwoDegree"),
+      Under("A", "TenDegree"),       Under("Dxx, Temperature:6500", "TwoDegree"),
+      Under("", "TwoDegree"),        Under("", "TwoDegree"),  // another curve object
       Under("Emission", "TwoDegree")};
   std::vector<std::vector<float>> expected;
   for (const HXMeasureConditions& lamp : lamps) {
