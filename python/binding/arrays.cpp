@@ -5,11 +5,13 @@
 #include <limits>
 #include <optional>
 #include <string>
+#include <vector>
 
 #include <pybind11/numpy.h>
 #include <pybind11/stl.h>
 
 #include "aldermoor/measure/context.h"
+#include "aldermoor/measure/words.h"
 
 #include "lock.h"
 #include "module.h"
@@ -273,6 +275,16 @@ py::tuple Channels(const std::string& space) {
   return py::tuple(py::cast(LabelsOf(space)));
 }
 
+constexpr const char* kWordsOf = R"(_words_of(key)
+--
+
+The words of the library for a key of the conditions, in order.)";
+
+py::tuple WordsOf(const std::string& key) {
+  const auto words = Measure::WordsOf(key);
+  return py::tuple(py::cast(std::vector<std::string>(words.begin(), words.end())));
+}
+
 }  // namespace
 
 void AddArrays(py::module_& module) {
@@ -287,6 +299,7 @@ void AddArrays(py::module_& module) {
   module.def("density", &Density, kDensity, arg("values"), arg("standard") = "DIN", py::kw_only(),
              arg("paper") = py::none(), arg("out") = py::none());
   module.def("channels", &Channels, kChannels, arg("space"));
+  module.def("_words_of", &WordsOf, kWordsOf, arg("key"));
 }
 
 }  // namespace Aldermoor::Python

@@ -3,10 +3,13 @@
 #include "aldermoor/measure/support.h"
 #include "aldermoor/tristim/hxcolorvector.h"
 #include "aldermoor/tristim/hxspectrum.h"
+#include "aldermoor/tristim/internals/vocabulary.h"
 #include "aldermoor/tristim/tristimservice.h"
 #include "aldermoor/vexdoc/colorimetrybridge.h"
 
 namespace Aldermoor::Measure {
+
+namespace Words = Tristim::Vocabulary;
 
 using Tristim::TristimService;
 using Vexdoc::ColorVector;
@@ -23,6 +26,10 @@ std::string WhatFailed(const Tristim::HXMeasureConditions& conditions) {
 
 float ColorDifference(const Spectrum& first, const Spectrum& second, const Conditions& conditions,
                       const DifferenceWeights& weights) try {
+  CheckViewing(conditions);
+  CheckWords(conditions, {Words::kDeltaEFormulaKey});
+  CheckKind(first);
+  CheckKind(second);
   const Tristim::HXMeasureConditions typed = Vexdoc::ToMeasureConditions(conditions);
   return Computed(
       [&] {
@@ -35,6 +42,9 @@ ALDERMOOR_FRAME(Aldermoor::Measure::ColorDifference)
 
 float ColorDifference(const ColorVector& first, const ColorVector& second,
                       const DifferenceWeights& weights) try {
+  CheckColor(first);
+  CheckColor(second);
+  CheckWords(*first.GetConditions(), {Words::kDeltaEFormulaKey});
   const Tristim::HXColorVector reference = Vexdoc::ToHXColorVector(first);
   return Computed(
       [&] {
@@ -48,6 +58,8 @@ float ColorDifference(const ColorVector& first, const ColorVector& second,
 ALDERMOOR_FRAME(Aldermoor::Measure::ColorDifference)
 
 ColorVector DifferenceVector(const ColorVector& first, const ColorVector& second) try {
+  CheckColor(first);
+  CheckColor(second);
   const Tristim::HXColorVector reference = Vexdoc::ToHXColorVector(first);
   return Computed(
       [&] {

@@ -10,6 +10,10 @@
 ///
 /// Nothing here keeps or changes a document.  Like all colorimetry of the library, the functions
 /// use state of the process: one thread at a time.
+///
+/// A word that colorimetry does not know, in conditions that decide a result, is a MeasureException
+/// with the words that would do (words.h), and so is an illumination "Userdefined" without a curve
+/// of 36 values.  Requests of a sample put their default in the place of such a word.
 namespace Aldermoor::Measure {
 
 /// Weights of a difference formula, in its own order: l and c of "CMC", kL, kC and kH of "94" and

@@ -56,7 +56,9 @@ struct SpectrumRows {
 /// results that are none, but 255 in "RGB" and the greatest value in a density.
 ///
 /// Throws: MeasureException where a single request would fail for every row, with its reason, and
-/// for arrays whose lengths do not fit; the output is unchanged then.
+/// for arrays whose lengths do not fit; the output is unchanged then.  Making one throws it for a
+/// word that colorimetry does not know (words.h), and for an illumination "Userdefined" without a
+/// curve of 36 values.
 class ALDERMOOR_EXPORT Context {
  public:
   /// `target`: what is asked for, by the words of the library: colour space, illuminant, observer,

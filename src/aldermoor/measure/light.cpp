@@ -11,6 +11,7 @@ using Tristim::TristimService;
 using Vexdoc::Spectrum;
 
 std::optional<float> ColorTemperature(const Spectrum& light) try {
+  CheckViewing(*light.GetConditions());
   return Computed(
       [&]() -> std::optional<float> {
         const Tristim::HXSpectrum spectrum = Vexdoc::ToHXSpectrum(light);
@@ -24,6 +25,7 @@ std::optional<float> ColorTemperature(const Spectrum& light) try {
 ALDERMOOR_FRAME(Aldermoor::Measure::ColorTemperature)
 
 ColorRendering ColorRenderingOf(const Spectrum& light) try {
+  CheckViewing(*light.GetConditions());
   return Computed(
       [&] {
         ColorRendering result;

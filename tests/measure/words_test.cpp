@@ -1,0 +1,98 @@
+#include "aldermoor/measure/words.h"
+
+#include <algorithm>
+#include <string>
+
+#include <gtest/gtest.h>
+
+#include "aldermoor/measure/measureexception.h"
+#include "aldermoor/tristim/hxmeasureconditions.h"
+
+#include "tests/utilities/messageof.h"
+
+namespace Aldermoor::Measure::Tests {
+namespace {
+
+using Aldermoor::Tests::MessageOf;
+using Tristim::HXMeasureConditions;
+
+// Colorimetry keeps tables of its own for the words; a word that stands in one of them alone would
+// be refused, or computed with a default.
+TEST(WordsTest, AreThoseOfColorimetry) {
+  for (const std::string_view key : WordKeys()) {
+    const auto words = WordsOf(key);
+    EXPECT_FALSE(words.empty()) << key;
+    for (const std::string_view word : words) {
+      HXMeasureConditions conditions;
+      conditions.SetMeasureCondition(key, std::string(word));
+      if (key != "CustomCondition") {
+        EXPECT_EQ(conditions.GetMeasureCondition(key), word);
+      }
+      EXPECT_TRUE(IsWordOf(key, word)) << key << " " << word;
+    }
+    for (const std::string& word : HXMeasureConditions::GetSupportedValues(key)) {
+      const bool is_form = word == "Dxx" || word == "F";
+      EXPECT_EQ(std::ranges::find(words, word) != words.end(), !is_form) << key << " " << word;
+    }
+  }
+  const HXMeasureConditions by_default;
+  for (const auto& [key, word] : by_default.GetMeasureConditions()) {
+    EXPECT_TRUE(std::ranges::find(WordKeys(), key) != WordKeys().end()) << key;
+    EXPECT_TRUE(IsWordOf(key, word)) << key << " " << word;
+  }
+}
+
+TEST(WordsTest, HaveFormsBesideTheList) {
+  constexpr const char* kIllumination = "Colorimetric.Illumination";
+  for (const char* const word :
+       {"Dxx, Temperature:1", "Dxx, Temperature:32767", "F7 ", "Undefined"}) {
+    EXPECT_TRUE(IsWordOf(kIllumination, word)) << word;
+  }
+  for (const char* const word :
+       {"Dxx, Temperature:0", "Dxx, Temperature:-5000", "Dxx, Temperature:32768",
+        "Dxx, Temperature:6500K", "Dxx, Temperature:", "Dxy, Temperature:6500", "Dxx", "D93", "F",
+        "F0", "F13", "F7x", "F 7", "A ", "", "6500K", " D65"}) {
+    EXPECT_FALSE(IsWordOf(kIllumination, word)) << word;
+  }
+  EXPECT_TRUE(IsWordOf("Physical.SpectrumType", "anything"));
+  EXPECT_TRUE(IsWordOf("Lab.Room", "anything"));
+}
+
+TEST(WordsTest, ProposeTheNearest) {
+  struct Case {
+    const char* key;
+    const char* word;
+    const char* nearest;
+  };
+  constexpr Case kCases[] = {{"ColorSpaceDescription.DeltaEFormula", "CIEDE2000", "2000"},
+                             {"ColorSpaceDescription.DeltaEFormula", "cielab", "CIELab"},
+                             {"ColorSpaceDescription.Type", "XYZ", "CIEXYZ"},
+                             {"ColorSpaceDescription.Type", "Lab", "CIELab"},
+                             {"ColorSpaceDescription.Type", "CIELAB", "CIELab"},
+                             {"ColorSpaceDescription.Type", "CIELch", "CIELCh"},
+                             {"ColorSpaceDescription.Type", "paint", ""},
+                             {"Colorimetric.Illumination", "d50", "D50"},
+                             {"Colorimetric.Illumination", "f11", "F11"},
+                             {"Colorimetric.Illumination", "emmision", "Emission"},
+                             {"Colorimetric.Illumination", "X", ""},
+                             {"Colorimetric.Observer", "Two", "TwoDegree"},
+                             {"Physical.Filter", "Pol", "Polarizer"},
+                             {"Physical.Filter", "", ""}};
+  for (const Case& c : kCases) {
+    EXPECT_EQ(NearestWord(c.word, WordsOf(c.key)), c.nearest) << c.key << " " << c.word;
+  }
+}
+
+TEST(WordsTest, AreNamedWhereOneIsRefused) {
+  EXPECT_EQ(MessageOf<MeasureException>([] { CheckWord("Colorimetric.Observer", "Ten"); }),
+            "Colorimetric.Observer: 'Ten' is not one of TwoDegree, TenDegree; did you mean "
+            "'TenDegree'?");
+  EXPECT_EQ(MessageOf<MeasureException>([] { CheckWord("Colorimetric.Illumination", "6500K"); }),
+            "Colorimetric.Illumination: '6500K' is not one of A, B, C, D50, D55, D65, D75, F1, F2, "
+            "F3, F4, F5, F6, F7, F8, F9, F10, F11, F12, Emission, Userdefined, a daylight such as "
+            "\"Dxx, Temperature:6500\"");
+  CheckWord("Colorimetric.Observer", "TenDegree");
+}
+
+}  // namespace
+}  // namespace Aldermoor::Measure::Tests
