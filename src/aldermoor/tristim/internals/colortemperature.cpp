@@ -80,6 +80,11 @@ class Locus {
     weights_ = {filter[0], filter[1], filter[2]};
   }
 
+  /// Whether `sample` is, to the last bit, the point of the locus.
+  [[nodiscard]] bool IsAt(float temperature, const Uv& sample) const {
+    return At(temperature) == sample;
+  }
+
   [[nodiscard]] bool GetCosine(float temperature, const Uv& sample, double& cosine) const {
     const Uv to_sample = Difference(sample, At(temperature));
     const float distance = Dot(to_sample, to_sample);
@@ -106,6 +111,10 @@ class Locus {
 
   AxisWeights weights_;
 };
+
+float Rounded(float kelvin) {
+  return std::floor(kelvin + 0.5F);
+}
 
 // 0 counts as positive.
 bool IsNegative(double cosine) {
@@ -145,13 +154,27 @@ bool ColorTemperature::GetPlanckianCosine(float temperature, const HXColorVector
 ALDERMOOR_FRAME(Aldermoor::Tristim::Internals::ColorTemperature::GetPlanckianCosine)
 
 float ColorTemperature::GetColorTemperature(const HXSpectrum& spectrum) const try {
+  return Search(spectrum).temperature;
+}
+ALDERMOOR_FRAME(Aldermoor::Tristim::Internals::ColorTemperature::GetColorTemperature)
+
+float ColorTemperature::FindColorTemperature(const HXSpectrum& spectrum) const try {
+  const Found found = Search(spectrum);
+  return found.temperature > 0.0F ? found.temperature : found.on_locus;
+}
+ALDERMOOR_FRAME(Aldermoor::Tristim::Internals::ColorTemperature::FindColorTemperature)
+
+ColorTemperature::Found ColorTemperature::Search(const HXSpectrum& spectrum) const {
+  const auto none = [](float on_locus = kNoTemperature) {
+    return Found{kNoTemperature, on_locus};
+  };
   HXMeasureConditions as_xyz = spectrum.GetMeasureConditions();
   as_xyz.SetMeasureCondition(Words::kColorSpaceKey, Words::kCIEXYZ);
   HXColorVector xyz;
   HXColorVector uvy;
   if (!TristimCalculator::GetVector_CIEXYZ(spectrum, as_xyz, xyz) ||
       !TristimCalculator::GetVector_CIEuvY1960(xyz, uvy)) {
-    return kNoTemperature;
+    return none();
   }
   const Uv sample = {uvy[0], uvy[1]};
   const Locus locus(spectrum.GetMeasureConditions());
@@ -161,13 +184,13 @@ float ColorTemperature::GetColorTemperature(const HXSpectrum& spectrum) const tr
   double at_low = 0.0;
   if (!locus.GetCosine(high, sample, at_high) || !locus.GetCosine(low, sample, at_low) ||
       IsNegative(at_high) == IsNegative(at_low)) {
-    return kNoTemperature;
+    return none(locus.IsAt(high, sample) ? high : kNoTemperature);
   }
   while (std::abs(high - low) > tolerance_) {
     const float middle = (high + low) / 2.0F;
     double at_middle = 0.0;
     if (!locus.GetCosine(middle, sample, at_middle)) {
-      return kNoTemperature;
+      return none(locus.IsAt(middle, sample) ? Rounded(middle) : kNoTemperature);
     }
     if (IsNegative(at_middle) != IsNegative(at_high)) {
       low = middle;
@@ -176,8 +199,7 @@ float ColorTemperature::GetColorTemperature(const HXSpectrum& spectrum) const tr
       at_high = at_middle;
     }
   }
-  return std::floor((high + low) / 2.0F + 0.5F);
+  return {Rounded((high + low) / 2.0F), kNoTemperature};
 }
-ALDERMOOR_FRAME(Aldermoor::Tristim::Internals::ColorTemperature::GetColorTemperature)
 
 }  // namespace Aldermoor::Tristim::Internals
