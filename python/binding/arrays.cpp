@@ -144,7 +144,8 @@ values: float32, shape (n, 36): spectra at 380 nm to 730 nm by 10 nm; with a col
     of rows, and the result has none then either.
 illuminant: "D65", "F11" ..., a daylight as "6500K", or 36 numbers of relative power.  Colours are
     taken as those of this illuminant, not adapted to it.  "Emission" makes the spectra those of
-    lights.
+    lights.  Daylight is defined from 4000K to 25000K; beyond, it is extrapolated without a
+    warning, and the white of 1000K has a negative Z.
 source: "Spectrum" for reflectances, 1 = perfect reflector; "Emission" for lights, whose colours
     are their own whatever the illuminant; or the colour space of `values`.
 paper: 36 reflectances to which the colours are relative, except those of lights.

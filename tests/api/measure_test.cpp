@@ -83,6 +83,9 @@ TEST(MeasureTest, DifferencesOfColorsAndSpectra) {
   EXPECT_NEAR(delta.GetDatastore()[0].second, 10.0, 1e-5);
   EXPECT_NEAR(delta.GetDatastore()[1].second, 5.0, 1e-5);
   EXPECT_EQ(delta.GetConditions()->GetAttribute(kSpace), "CIELCh");
+  EXPECT_EQ(delta.GetConditions()->GetAttribute("ColorSpaceDescription.AbsoluteOrDeltaVector"),
+            "DeltaVector");
+  EXPECT_EQ(delta.GetDatastore()[2].first, "delta H*");
 
   EXPECT_EQ(ReasonOf([] { ColorDifference(Lab(1, 2, 3, "LABhx"), Lab(1, 2, 3)); }),
             "the colour difference \"LABhx\" of two colours cannot be computed");
@@ -96,6 +99,11 @@ TEST(MeasureTest, DifferencesOfColorsAndSpectra) {
             "the colour difference \"CIELab\" cannot be computed: the white base is \"Paper\" and "
             "there is no paper white");
   EXPECT_EQ(ReasonOf([] { DifferenceVector(Lab(1, 2, 3, "94", "CIEXYZ"), Lab(1, 2, 3)); }),
+            "there is no difference vector of a colour in \"CIEXYZ\" and one in \"CIELab\"");
+  EXPECT_EQ(ReasonOf([] {
+              const ColorVector xyz = Lab(1, 2, 3, "94", "CIEXYZ");
+              DifferenceVector(xyz, xyz);
+            }),
             "there is no difference vector in the colour space \"CIEXYZ\"");
 }
 
@@ -328,6 +336,45 @@ TEST(MeasureTest, LightsHaveATemperatureAndAnIndex) {
             ReasonOf([&] { ColorRenderingOf(odd); }));
   EXPECT_NE(ReasonOf([&] { (void)ColorTemperature(odd); }).find("spectrum size"),
             std::string::npos);
+}
+
+/// Relative power of a black body, by Planck's law with the constants of the library.
+Spectrum BlackBody(double kelvin, const Conditions& conditions, double scale = 1.0) {
+  std::vector<float> values;
+  for (int i = 0; i < 36; ++i) {
+    const double metres = (380 + 10 * i) * 1e-9;
+    values.push_back(static_cast<float>(scale * 1.19104678203084e-16 / std::pow(metres, 5) /
+                                        (std::exp(0.014388443415906128 / (kelvin * metres)) - 1)));
+  }
+  return {conditions, values};
+}
+
+// Some stand on the locus to the last bit of u and v, where there is no direction towards it.
+TEST(MeasureTest, BlackBodiesHaveTheirTemperatureAndAnIndex) {
+  const Conditions emission = Of({{kLight, "Emission"}});
+  for (int kelvin = 1000; kelvin <= 20000; kelvin += 10) {
+    const Spectrum light = BlackBody(kelvin, emission);
+    EXPECT_NEAR(ColorTemperature(light).value_or(0.0F), kelvin, 1 + kelvin * 1e-4) << kelvin;
+    const ColorRendering rendering = ColorRenderingOf(light);
+    const ColorRendering scaled = ColorRenderingOf(BlackBody(kelvin, emission, 1000.0));
+    EXPECT_GT(rendering.index, 0.0F) << kelvin;
+    EXPECT_NEAR(rendering.index, scaled.index, 1.0) << kelvin;
+    EXPECT_EQ(rendering.reference, scaled.reference) << kelvin;
+  }
+}
+
+TEST(MeasureTest, SaysWhyALightHasNeitherTemperatureNorIndex) {
+  const Conditions ten = Of({{kLight, "Emission"}, {"Colorimetric.Observer", "TenDegree"}});
+  const std::string why =
+      "under the observer \"TenDegree\" the search for the colour temperature does not find the "
+      "upper end of the black-body locus; ask for \"TwoDegree\"";
+  EXPECT_EQ(ReasonOf([&] { (void)ColorTemperature(Flat(1, ten)); }), why);
+  EXPECT_EQ(ReasonOf([&] { ColorRenderingOf(Flat(1, ten)); }), why);
+  EXPECT_FALSE(ColorTemperature(Flat(0, ten))) << "dark";
+  EXPECT_FALSE(ColorTemperature(Flat(std::nanf(""), ten)));
+  EXPECT_EQ(ReasonOf([] { ColorRenderingOf(Flat(1)); }),
+            "the colour rendering index is that of a light, and the conditions of this spectrum do "
+            "not say \"Emission\" under \"Colorimetric.Illumination\"");
 }
 
 TEST(MeasureTest, DensitiesAndTheirCalibration) {

@@ -1,5 +1,9 @@
 #include "aldermoor/measure/colordifference.h"
 
+#include <string>
+#include <utility>
+#include <vector>
+
 #include "aldermoor/measure/support.h"
 #include "aldermoor/tristim/hxcolorvector.h"
 #include "aldermoor/tristim/hxspectrum.h"
@@ -20,6 +24,17 @@ namespace {
 
 std::string WhatFailed(const Tristim::HXMeasureConditions& conditions) {
   return "the colour difference \"" + conditions.GetDeltaEFormula() + "\"";
+}
+
+/// With the conditions and the labels of differences: hue is told apart from a difference of hues.
+ColorVector Labelled(const Tristim::HXColorVector& difference) {
+  Tristim::HXMeasureConditions conditions = difference.GetMeasureConditions();
+  conditions.SetMeasureCondition(Words::kVectorKindKey, Words::kDeltaVector);
+  std::vector<std::pair<std::string, float>> channels;
+  for (unsigned short i = 0; i < 3; ++i) {
+    channels.emplace_back(conditions.GetElementName(i), difference[static_cast<short>(i)]);
+  }
+  return {Vexdoc::ToConditions(conditions), channels};
 }
 
 }  // namespace
@@ -61,15 +76,17 @@ ColorVector DifferenceVector(const ColorVector& first, const ColorVector& second
   CheckColor(first);
   CheckColor(second);
   const Tristim::HXColorVector reference = Vexdoc::ToHXColorVector(first);
+  const Tristim::HXColorVector other = Vexdoc::ToHXColorVector(second);
+  const std::string& space = reference.GetMeasureConditions().GetColorSpace();
+  const std::string& other_space = other.GetMeasureConditions().GetColorSpace();
+  if (space != other_space) {
+    throw MeasureException("there is no difference vector of a colour in \"" + space +
+                               "\" and one in \"" + other_space + "\"",
+                           ALDERMOOR_HERE(Aldermoor::Measure::DifferenceVector));
+  }
   return Computed(
-      [&] {
-        return *Vexdoc::ToColorVector(
-            TristimService::GetDeltaVector(reference, Vexdoc::ToHXColorVector(second)));
-      },
-      [&] {
-        return "there is no difference vector in the colour space \"" +
-               reference.GetMeasureConditions().GetColorSpace() + "\"";
-      });
+      [&] { return Labelled(TristimService::GetDeltaVector(reference, other)); },
+      [&] { return "there is no difference vector in the colour space \"" + space + "\""; });
 }
 ALDERMOOR_FRAME(Aldermoor::Measure::DifferenceVector)
 

@@ -63,7 +63,8 @@ class ALDERMOOR_EXPORT Context {
  public:
   /// `target`: what is asked for, by the words of the library: colour space, illuminant, observer,
   /// white base and difference formula; as for a request, D65, two-degree, CIELab and "Automatic"
-  /// stand for what is not said.
+  /// stand for what is not said.  A daylight outside 4000 K to 25000 K is extrapolated without a
+  /// warning (words.h).
   /// `source`: what the arrays hold.  For spectra, whether the illumination is "Emission"; for
   /// colours, all that stands for `target` too.
   /// `paper_white`: the paper that the white base "Paper" refers to.

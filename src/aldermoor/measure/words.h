@@ -14,7 +14,7 @@
 namespace Aldermoor::Measure {
 
 /// Between these, kelvin, daylight is defined.  Outside, its formulas go on and mean less: the
-/// white of 1000 K has negative XYZ.  Source: CIE 15:2004, 3.1.
+/// white of 1000 K has a negative Z.  Source: CIE 15:2004, 3.1.
 inline constexpr int kColdestDaylight = 4000;
 inline constexpr int kHottestDaylight = 25000;
 
