@@ -17,11 +17,11 @@
 #include "aldermoor/utilities/exceptions/exceptions.h"
 #include "aldermoor/vexdoc/inspection.h"
 #include "aldermoor/vexdoc/internals/cachestamp.h"
+#include "aldermoor/vexdoc/loadoptions.h"
 #include "aldermoor/vexdoc/spectrum.h"
 #include "aldermoor/vexdoc/vexexception.h"
 
 #include "tests/utilities/messageof.h"
-#include "aldermoor/vexdoc/loadoptions.h"
 #include "tests/vexdoc/internals/documenttext.h"
 #include "tests/vexdoc/internals/loadsupport.h"
 #include "tests/vexdoc/internals/writesupport.h"
