@@ -3,6 +3,7 @@
 
 #include <cmath>
 #include <exception>
+#include <optional>
 #include <string>
 #include <vector>
 
@@ -361,6 +362,18 @@ TEST(MeasureTest, BlackBodiesHaveTheirTemperatureAndAnIndex) {
     EXPECT_NEAR(rendering.index, scaled.index, 1.0) << kelvin;
     EXPECT_EQ(rendering.reference, scaled.reference) << kelvin;
   }
+}
+
+// The search ends where the locus hardly moves, at half a million kelvin.
+TEST(MeasureTest, DeepRedsHaveNoTemperature) {
+  const Conditions emission = Of({{kLight, "Emission"}});
+  std::vector<float> red(36, 0.0F);
+  red[34] = 1.0F;  // 720 nm alone
+  EXPECT_EQ(ColorTemperature({emission, red}), std::nullopt);
+  EXPECT_EQ(ColorTemperature(BlackBody(985, emission)), std::nullopt);
+  red[34] = 0.0F;
+  red[20] = 1.0F;  // 580 nm alone, beside the locus
+  EXPECT_NEAR(ColorTemperature({emission, red}).value_or(0.0F), 2589, 1);
 }
 
 TEST(MeasureTest, SaysWhyALightHasNeitherTemperatureNorIndex) {

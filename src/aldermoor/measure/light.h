@@ -11,8 +11,9 @@ namespace Aldermoor::Measure {
 
 /// Correlated colour temperature of a light in whole kelvin, for the observer of its own
 /// conditions, which must say "Emission" under "Colorimetric.Illumination" for a lamp to be read as
-/// one. Nothing if there is none: no band is above 0, or the light stands beyond the ends of the
-/// search (250 K to 999,950 K).
+/// one. Nothing if there is none: no band is above 0, the light stands beyond the ends of the
+/// search (250 K to 999,950 K), or the search does not end at the nearest point of the locus, as
+/// for deep reds.
 ///
 /// From 36 bands and in single precision the results of the two-degree observer differ from those
 /// of 5 nm tables by a few kelvin, for lamps with emission lines by far more; above about 40,000 K,

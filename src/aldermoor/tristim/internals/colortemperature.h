@@ -19,7 +19,8 @@ class ColorTemperature {
   /// locus, or has no chromaticity.  Black has that of equal energy, and so about 5456 K.
   [[nodiscard]] float GetColorTemperature(const HXSpectrum& spectrum) const;
   /// The same, but a light on which the search comes to stand exactly has the temperature of that
-  /// point of the locus, in place of -1.
+  /// point of the locus in place of -1, and one for which it ended far from the nearest point -1:
+  /// a black body of 985 K would have 500,108 K.
   [[nodiscard]] float FindColorTemperature(const HXSpectrum& spectrum) const;
 
   /// Spectral radiance in W per m3 and sr; `temperature` in kelvin.
