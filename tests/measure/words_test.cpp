@@ -1,6 +1,8 @@
 #include "aldermoor/measure/words.h"
 
 #include <algorithm>
+#include <fstream>
+#include <iterator>
 #include <string>
 
 #include <gtest/gtest.h>
@@ -39,6 +41,33 @@ TEST(WordsTest, AreThoseOfColorimetry) {
   for (const auto& [key, word] : by_default.GetMeasureConditions()) {
     EXPECT_TRUE(std::ranges::find(WordKeys(), key) != WordKeys().end()) << key;
     EXPECT_TRUE(IsWordOf(key, word)) << key << " " << word;
+  }
+}
+
+std::string ReadPage(const std::string& name) {
+  std::ifstream file(ALDERMOOR_TEST_DATA "/../../docs/" + name);
+  return {std::istreambuf_iterator<char>(file), {}};
+}
+
+// The row of a key in the table of the page; colour spaces have a page of their own.
+TEST(WordsTest, StandInTheDocumentation) {
+  const std::string conditions = ReadPage("conditions.md");
+  const std::string spaces = ReadPage("colorspaces.md");
+  for (const std::string_view key : WordKeys()) {
+    if (key.find("Wavelength") != key.npos || key.find("NumberOf") != key.npos) {
+      continue;  // told in words
+    }
+    const std::size_t begin = conditions.find("\n| `" + std::string(key) + "` |");
+    ASSERT_NE(begin, conditions.npos) << key;
+    const std::string row = conditions.substr(begin, conditions.find('\n', begin + 1) - begin);
+    const bool is_space = key == "ColorSpaceDescription.Type";
+    for (const std::string_view word : WordsOf(key)) {
+      const bool is_between = word.size() > 1 && word[0] == 'F' && word != "F1" && word != "F12" &&
+                              key == "Colorimetric.Illumination";
+      const std::string quoted = '`' + std::string(word) + '`';
+      EXPECT_NE((is_space ? spaces : row).find(is_between ? "`F1` … `F12`" : quoted), row.npos)
+          << key << " " << word;
+    }
   }
 }
 
