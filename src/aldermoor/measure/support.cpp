@@ -1,10 +1,13 @@
 #include "aldermoor/measure/support.h"
 
+#include <algorithm>
+
 #include "aldermoor/measure/words.h"
 #include "aldermoor/tristim/hxspectrum.h"
 #include "aldermoor/tristim/internals/basecalculator.h"
 #include "aldermoor/tristim/internals/vocabulary.h"
 #include "aldermoor/vexdoc/colorimetrybridge.h"
+#include "aldermoor/vexdoc/conditionkeys.h"
 
 namespace Aldermoor::Measure {
 
@@ -12,18 +15,19 @@ namespace Words = Tristim::Vocabulary;
 
 void CheckWords(const Vexdoc::Conditions& conditions,
                 std::initializer_list<std::string_view> keys) {
-  const auto& attributes = conditions.GetAttributes();
-  for (const std::string_view key : keys) {
-    const auto found = attributes.find(std::string(key));
-    if (found != attributes.end()) {
-      CheckWord(key, found->second);
+  // One walk over the few attributes is quicker than a string for each look-up.
+  for (const auto& [key, word] : conditions.GetAttributes()) {
+    if (std::ranges::find(keys, std::string_view(key)) != keys.end()) {
+      CheckWord(key, word);
     }
   }
 }
 
 void CheckViewing(const Vexdoc::Conditions& conditions) {
   CheckWords(conditions, {Words::kIlluminationKey, Words::kObserverKey, Words::kWhiteBaseKey});
-  if (conditions.GetAttribute(Words::kIlluminationKey, "") != Words::kUserdefined) {
+  const auto& attributes = conditions.GetAttributes();
+  const auto illumination = attributes.find(Vexdoc::ConditionKeys::kIllumination);
+  if (illumination == attributes.end() || illumination->second != Words::kUserdefined) {
     return;
   }
   const std::string what =
