@@ -7,8 +7,10 @@
 
 #include <gtest/gtest.h>
 
+#include "aldermoor/measure/density.h"
 #include "aldermoor/measure/measureexception.h"
 #include "aldermoor/tristim/hxmeasureconditions.h"
+#include "aldermoor/tristim/internals/measureconditiongetstrings.h"
 
 #include "tests/utilities/messageof.h"
 
@@ -17,6 +19,7 @@ namespace {
 
 using Aldermoor::Tests::MessageOf;
 using Tristim::HXMeasureConditions;
+using Tristim::Internals::MeasureConditionTranslator;
 
 // Colorimetry keeps tables of its own for the words; a word that stands in one of them alone would
 // be refused, or computed with a default.
@@ -41,6 +44,43 @@ TEST(WordsTest, AreThoseOfColorimetry) {
   for (const auto& [key, word] : by_default.GetMeasureConditions()) {
     EXPECT_TRUE(std::ranges::find(WordKeys(), key) != WordKeys().end()) << key;
     EXPECT_TRUE(IsWordOf(key, word)) << key << " " << word;
+  }
+}
+
+/// Every number that has a word in colorimetry.
+template <class Enum>
+void ExpectNumbersOf(std::string_view key) {
+  for (int number = -1; number < 20; ++number) {
+    const std::string word = MeasureConditionTranslator::ToString(static_cast<Enum>(number));
+    EXPECT_TRUE(word == "Undefined" || std::ranges::find(WordsOf(key), word) != WordsOf(key).end())
+        << key << " " << word;
+  }
+}
+
+TEST(WordsTest, LeaveNoneOfColorimetryOut) {
+  ExpectNumbersOf<Tristim::Observer>("Colorimetric.Observer");
+  ExpectNumbersOf<Tristim::WhiteBase>("Colorimetric.WhiteBase");
+  ExpectNumbersOf<Tristim::PhysicalFilter>("Physical.Filter");
+  ExpectNumbersOf<Tristim::DensityStandard>("Colorimetric.DensityStandard");
+  ExpectNumbersOf<Tristim::DensityFilterMode>("Colorimetric.DensityFilterMode");
+  for (int type = 0; type < Tristim::IlluminationType::kDaylightS0; ++type) {
+    const std::string word = MeasureConditionTranslator::ToString(Tristim::HXIllumination(type));
+    const bool has_number = type == Tristim::IlluminationType::kDaylight ||
+                            type == Tristim::IlluminationType::kFluorescent;
+    EXPECT_TRUE(has_number || IsWordOf("Colorimetric.Illumination", word)) << word;
+  }
+}
+
+// The values of the enumerations are the places of the words.
+TEST(WordsTest, HaveTheNumbersOfColorimetry) {
+  for (const std::string_view word : WordsOf("Colorimetric.DensityStandard")) {
+    EXPECT_EQ(static_cast<int>(DensityStandardOf(std::string(word))),
+              static_cast<int>(MeasureConditionTranslator::GetDensityStandard(std::string(word))));
+  }
+  for (const std::string_view word : WordsOf("Colorimetric.DensityFilterMode")) {
+    EXPECT_EQ(
+        static_cast<int>(DensityModeOf(std::string(word))),
+        static_cast<int>(MeasureConditionTranslator::GetDensityFilterMode(std::string(word))));
   }
 }
 
