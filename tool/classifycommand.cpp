@@ -51,8 +51,7 @@ class ClassifyCommand : public Command {
     AddOption(app, "--illuminant", illuminant_, "WORD",
               "Illuminant in place of that of the sample's conditions: " + IlluminantHelp());
     AddOption(app, "--observer", observer_, "WORD",
-              "Observer in place of that of the sample's conditions: " +
-                  std::string(*WordsFor(kObserverKey)));
+              "Observer in place of that of the sample's conditions: " + ShownWords(kObserverKey));
     filter_.AddTo(app);
     output_.AddTo(app, "table csv json");
   }

@@ -10,14 +10,6 @@
 
 namespace Aldermoor::Tool {
 
-namespace {
-
-std::string Words(const std::string& key) {
-  return std::string(*WordsFor(key));
-}
-
-}  // namespace
-
 void SetIlluminant(Vexdoc::Conditions& request, const std::string& option,
                    const std::string& word) {
   if (word.starts_with(kSpectrumMark)) {
@@ -42,15 +34,15 @@ std::string IlluminantFile(const std::string& word) {
 }
 
 std::string IlluminantHelp() {
-  return Words(kIlluminationKey) +
+  return ShownWords(kIlluminationKey) +
          "; a daylight of 4000K to 25000K, such as 6500K; a spectrum of a document as "
          "@FILE:SET/SAMPLE";
 }
 
 void ColorOptions::AddTo(CLI::App& app) {
-  AddOption(app, "--space", space, "WORD", "Colour space: " + Words(kTypeKey));
+  AddOption(app, "--space", space, "WORD", "Colour space: " + ShownWords(kTypeKey));
   AddViewingTo(app);
-  AddOption(app, "--white-base", white_base, "WORD", "White base: " + Words(kWhiteBaseKey));
+  AddOption(app, "--white-base", white_base, "WORD", "White base: " + ShownWords(kWhiteBaseKey));
   AddOption(app, "--condition", conditions, "KEY=VALUE",
             "Further condition as KEY=VALUE; may be repeated.  A key outside the vocabulary "
             "needs CustomCondition=Enable in front of it");
@@ -58,7 +50,7 @@ void ColorOptions::AddTo(CLI::App& app) {
 
 void ColorOptions::AddViewingTo(CLI::App& app) {
   AddOption(app, "--illuminant", illuminant, "WORD", "Illuminant: " + IlluminantHelp());
-  AddOption(app, "--observer", observer, "WORD", "Observer: " + Words(kObserverKey));
+  AddOption(app, "--observer", observer, "WORD", "Observer: " + ShownWords(kObserverKey));
 }
 
 Vexdoc::Conditions ColorOptions::MakeConditions() const {
@@ -81,7 +73,7 @@ void ColorOptions::ApplyConditions(Vexdoc::Conditions& request) const {
     }
     const std::string key = condition.substr(0, equals);
     const std::string value = condition.substr(equals + 1);
-    if (WordsFor(key)) {
+    if (IsKey(key)) {
       request.AddAttribute(key, ConditionValue("--condition " + key, key, value));
     } else if (request.GetAttribute(kCustomKey, "") == kEnable) {
       request.AddAttribute(key, value);

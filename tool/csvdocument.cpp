@@ -215,7 +215,7 @@ class CsvImport {
         faults_.Add(place,
                     fmt::format("{} of the colours is not given; expected a line # {}=WORD or "
                                 "--condition {}=WORD, one of {}",
-                                key, key, key, fmt::join(SplitWords(*WordsFor(key)), ", ")));
+                                key, key, key, fmt::join(WordsFor(key), ", ")));
       }
     }
   }

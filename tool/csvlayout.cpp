@@ -67,7 +67,7 @@ std::optional<std::vector<std::size_t>> FindSpace(const std::string& color_space
 }
 
 std::vector<std::string> AllSpaces() {
-  const auto words = SplitWords(*WordsFor(kTypeKey));
+  const auto words = WordsFor(kTypeKey);
   return {words.begin(), words.end()};
 }
 

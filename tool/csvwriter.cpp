@@ -138,7 +138,7 @@ class CsvExport {
       return "a second colour";
     }
     const std::string type = conditions.GetAttribute(kTypeKey, "");
-    const auto words = SplitWords(*WordsFor(kTypeKey));
+    const auto words = WordsFor(kTypeKey);
     if (std::find(words.begin(), words.end(), type) == words.end()) {
       return fmt::format("a colour in '{}'", type);
     }

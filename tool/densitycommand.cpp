@@ -10,6 +10,7 @@
 #include <vector>
 
 #include <fmt/format.h>
+#include <fmt/ranges.h>
 
 #include "aldermoor/measure/density.h"
 #include "aldermoor/measure/paperwhite.h"
@@ -208,9 +209,9 @@ class DensityCommand : public Command {
   void AddOptions(CLI::App& app) override {
     inputs_.AddTo(app);
     AddOption(app, "--standard", request_.standard_word, "WORD",
-              fmt::format("Standard: {}", kStandards));
+              fmt::format("Standard: {}", fmt::join(Standards(), " ")));
     AddOption(app, "--filter", request_.mode_word, "WORD",
-              "Channel that is reported: " + std::string(*WordsFor(kModeKey)));
+              "Channel that is reported: " + ShownWords(kModeKey));
     AddPath(app, "--paper", paper_, "Paper, to which densities are then relative");
     AddFlag(app, "--absolute", request_.absolute, "Leave densities absolute in spite of --paper");
     AddOption(app, "--solid", solids_, "SET/SAMPLE",
@@ -248,7 +249,11 @@ class DensityCommand : public Command {
 
  private:
   // Without "User": the program has no way to set its curves.
-  static constexpr std::string_view kStandards = "DIN DINNB ANSIA ANSIE ANSII ANSIT SPI";
+  static std::vector<std::string_view> Standards() {
+    std::vector<std::string_view> words = WordsFor(kStandardKey);
+    std::erase(words, "User");
+    return words;
+  }
 
   static void AddPath(CLI::App& app, const char* option, std::optional<std::string>& path,
                       const char* help) {
@@ -262,7 +267,7 @@ class DensityCommand : public Command {
 
   void CompleteRequest() {
     inputs_.CheckStandardInput();
-    CheckWord("--standard", request_.standard_word, SplitWords(kStandards));
+    CheckWord("--standard", request_.standard_word, Standards());
     request_.options.standard = Measure::DensityStandardOf(request_.standard_word);
     request_.options.paper_relative = paper_ && !request_.absolute;
     request_.mode =

@@ -162,8 +162,7 @@ class DiffCommand : public Command {
   void AddOptions(CLI::App& app) override {
     AddArgument(app, "REFERENCE", reference_, "Document to compare with; - is standard input");
     AddArguments(app, "SAMPLE", inputs_.paths, "Documents to compare");
-    AddOption(app, "--formula", formula_, "WORD",
-              "Difference formula: " + std::string(*WordsFor(kFormulaKey)));
+    AddOption(app, "--formula", formula_, "WORD", "Difference formula: " + ShownWords(kFormulaKey));
     AddOption(app, "--weights", weights_, "N,...", "Weights: kL,kC,kH of 94 and 2000, l,c of CMC");
     AddOption(app, "--limit", limit_, "N", "Tell which files have no difference above this");
     AddFlag(app, "--summary", only_summary_, "Leave out the single differences");

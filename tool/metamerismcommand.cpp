@@ -37,8 +37,7 @@ class MetamerismCommand : public Command {
               "Illuminant under which the pairs match: " + IlluminantHelp());
     AddOption(app, "--test", tests_, "WORD,...",
               "Named illuminants under which they may not, with commas between them");
-    AddOption(app, "--observer", observer_, "WORD",
-              "Observer: " + std::string(*WordsFor(kObserverKey)));
+    AddOption(app, "--observer", observer_, "WORD", "Observer: " + ShownWords(kObserverKey));
     filter_.AddTo(app);
     output_.AddTo(app, "table csv json");
   }

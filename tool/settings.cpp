@@ -63,7 +63,7 @@ std::optional<Setting> Setting::Parse(std::string_view text) {
 }
 
 bool IsInVocabulary(const std::string& key, const std::string& value) {
-  if (!WordsFor(key)) {
+  if (!IsKey(key)) {
     return false;
   }
   if (key == kIlluminationKey && value.starts_with("Dxx")) {
@@ -86,7 +86,7 @@ void KindConditions::Add(const std::string& what, const Setting& setting) {
     return;
   }
   const std::string key(Trimmed(setting.key));
-  if (!WordsFor(key)) {
+  if (!IsKey(key)) {
     throw UsageError(fmt::format(
         "{}: '{}' is not one of {}; a key of your own is written Spectrum.KEY or Color.KEY", what,
         key, fmt::join(AllKeys(), ", ")));
@@ -105,7 +105,7 @@ void KindConditions::AddAnyText(const std::string& what, const std::string& key,
   if (key.empty()) {
     throw UsageError(fmt::format("{}: a condition without a key", what));
   }
-  if (WordsFor(key) && !IsInVocabulary(key, value) && !value.starts_with("Dxx")) {
+  if (IsKey(key) && !IsInVocabulary(key, value) && !value.starts_with("Dxx")) {
     Report(fmt::format("{}: '{}' is no word of {}; it is taken as it is", what, value, key));
   }
   conditions.emplace(key, value);

@@ -2,12 +2,14 @@
 
 #include <algorithm>
 #include <charconv>
-#include <iterator>
 #include <limits>
+#include <optional>
 #include <system_error>
 
 #include <fmt/format.h>
 #include <fmt/ranges.h>
+
+#include "aldermoor/measure/words.h"
 
 #include "diagnostics.h"
 #include "exitstatus.h"
@@ -15,36 +17,7 @@
 namespace Aldermoor::Tool {
 namespace {
 
-struct Entry {
-  std::string_view key;
-  std::string_view words;
-};
-
-constexpr Entry kVocabulary[] = {
-    {"ColorSpaceDescription.Type",
-     "CIELab CIELCh CIELuv CIELChuv CIEuvY1960 CIEuvY1976 CIEXYZ CIExyY HunterLab RxRyRz LABhx "
-     "LCHhx RGB CMYK"},
-    {"ColorSpaceDescription.AbsoluteOrDeltaVector", "AbsoluteVector DeltaVector"},
-    {"ColorSpaceDescription.DeltaEFormula", "CIELab CIELuv LABhx FMCII CMC 94 2000"},
-    {"Colorimetric.Illumination",
-     "A B C D50 D55 D65 D75 F1 F2 F3 F4 F5 F6 F7 F8 F9 F10 F11 F12 Emission"},
-    {"Colorimetric.Observer", "TwoDegree TenDegree"},
-    {"Colorimetric.WhiteBase", "Absolute Paper Automatic"},
-    {"Colorimetric.DensityStandard", "DIN DINNB ANSIA ANSIE ANSII ANSIT SPI User"},
-    {"Colorimetric.DensityFilterMode", "Black Cyan Magenta Yellow Max Auto"},
-    {"Physical.Filter", "No Polarizer UVCut D65 LastSelectable Custom CalibrationCheck ND0"},
-    {"Physical.SpectrumType", "Remission Emission Transmission AmbientLight Flash"},
-    {"Physical.NumberOfDataPointsSpectrum", "36"},
-    {"Physical.WavelengthSpectrumMin", "380nm"},
-    {"Physical.WavelengthSpectrumMax", "730nm"},
-    {"CustomCondition", "Enable Disable"},
-};
-
 constexpr std::string_view kDaylight = "Dxx, Temperature:";
-
-// CIE daylight is defined in this range, kelvin.  Source: CIE 15:2004, 3.1.
-constexpr int kColdestDaylight = 4000;
-constexpr int kHottestDaylight = 25000;
 
 // The number in `text`, if it is nothing else.
 std::optional<long long> Number(std::string_view text) {
@@ -80,37 +53,36 @@ std::vector<std::string_view> SplitWords(std::string_view list) {
 }
 
 void CheckWord(const std::string& what, const std::string& word,
-               const std::vector<std::string_view>& words) {
+               const std::vector<std::string_view>& words,
+               const std::vector<std::string_view>& others) {
   if (std::find(words.begin(), words.end(), word) == words.end()) {
-    throw UsageError(fmt::format("{}: '{}' is not one of {}", what, word, fmt::join(words, ", ")));
+    throw UsageError(Measure::NoSuchWord(what, word, words, others));
   }
 }
 
-std::optional<std::string_view> WordsFor(const std::string& key) {
-  const auto* const found = std::find_if(std::begin(kVocabulary), std::end(kVocabulary),
-                                         [&key](const Entry& entry) { return entry.key == key; });
-  if (found == std::end(kVocabulary)) {
-    return std::nullopt;
+std::vector<std::string_view> WordsFor(const std::string& key) {
+  const auto all = Measure::WordsOf(key);
+  std::vector<std::string_view> words(all.begin(), all.end());
+  if (key == kIlluminationKey) {
+    words.erase(std::find(words.begin(), words.end(), kUserdefined));
   }
-  return found->words;
+  return words;
+}
+
+std::string ShownWords(const std::string& key) {
+  return fmt::format("{}", fmt::join(WordsFor(key), " "));
 }
 
 std::vector<std::string_view> AllKeys() {
-  std::vector<std::string_view> keys;
-  std::transform(std::begin(kVocabulary), std::end(kVocabulary), std::back_inserter(keys),
-                 [](const Entry& entry) { return entry.key; });
-  return keys;
+  const auto keys = Measure::WordKeys();
+  return {keys.begin(), keys.end()};
 }
 
 std::string IlluminationValue(const std::string& what, const std::string& word) {
   const std::optional<long long> kelvin = Temperature(word);
   if (!kelvin) {
-    std::vector<std::string_view> words = SplitWords(*WordsFor(kIlluminationKey));
-    if (std::find(words.begin(), words.end(), word) == words.end()) {
-      words.emplace_back("a daylight such as 6500K");
-      words.emplace_back("a spectrum as @FILE:SET/SAMPLE (with --illuminant)");
-    }
-    CheckWord(what, word, words);
+    CheckWord(what, word, WordsFor(kIlluminationKey),
+              {"a daylight such as 6500K", "a spectrum as @FILE:SET/SAMPLE (with --illuminant)"});
     return word;
   }
   // The library keeps temperatures in 16 bits.
@@ -118,11 +90,11 @@ std::string IlluminationValue(const std::string& what, const std::string& word) 
     throw UsageError(
         fmt::format("{}: '{}' is no temperature of daylight, which is defined from {} "
                     "to {} K",
-                    what, word, kColdestDaylight, kHottestDaylight));
+                    what, word, Measure::kColdestDaylight, Measure::kHottestDaylight));
   }
-  if (*kelvin < kColdestDaylight || *kelvin > kHottestDaylight) {
+  if (*kelvin < Measure::kColdestDaylight || *kelvin > Measure::kHottestDaylight) {
     Report(fmt::format("warning: daylight is defined from {} to {} K; {} K is extrapolated",
-                       kColdestDaylight, kHottestDaylight, *kelvin));
+                       Measure::kColdestDaylight, Measure::kHottestDaylight, *kelvin));
   }
   return fmt::format("{}{}", kDaylight, *kelvin);
 }
@@ -132,7 +104,7 @@ std::string ConditionValue(const std::string& what, const std::string& key,
   if (key == kIlluminationKey) {
     return IlluminationValue(what, value);
   }
-  CheckWord(what, value, SplitWords(*WordsFor(key)));
+  CheckWord(what, value, WordsFor(key));
   return value;
 }
 

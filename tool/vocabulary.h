@@ -2,13 +2,12 @@
 #define ALDERMOOR_TOOL_VOCABULARY_H
 
 #include <cstddef>
-#include <optional>
 #include <string>
 #include <string_view>
 #include <vector>
 
-/// The words of the conditions.  The library keeps its default for a word that it does not know,
-/// so a misspelt one is found here or never.
+/// The words of the conditions, from the library.  A request of a sample keeps its default for a
+/// word that is none, so a misspelt one is found here or never.
 namespace Aldermoor::Tool {
 
 /// The number of values in the spectra of which colours and densities are computed.
@@ -26,13 +25,20 @@ inline const std::string kEmission = "Emission";
 /// The words of a list that is separated by blanks.
 std::vector<std::string_view> SplitWords(std::string_view list);
 
-/// Throws: UsageError that names `what` and lists `words`, if `word` is none of them.
+/// Throws: UsageError that names `what`, lists `words` and `others`, which describe further ones,
+/// and proposes the nearest, if `word` is none of `words`.
 void CheckWord(const std::string& what, const std::string& word,
-               const std::vector<std::string_view>& words);
+               const std::vector<std::string_view>& words,
+               const std::vector<std::string_view>& others = {});
 
-/// The words for `key`, blanks between them; nothing for a key outside the vocabulary.  The
-/// illuminants are those without a form of their own.
-std::optional<std::string_view> WordsFor(const std::string& key);
+/// The words for `key`; none for a key outside the vocabulary.  The illuminants are those without
+/// a form of their own.
+std::vector<std::string_view> WordsFor(const std::string& key);
+inline bool IsKey(const std::string& key) {
+  return !WordsFor(key).empty();
+}
+/// The same with blanks between them, for a help.
+std::string ShownWords(const std::string& key);
 /// Every key of the vocabulary.
 std::vector<std::string_view> AllKeys();
 

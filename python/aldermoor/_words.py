@@ -33,4 +33,8 @@ ILLUMINANTS: tuple[str, ...] = (
     *(f"F{number}" for number in range(1, 13)),
     "Emission",
 )  # fmt: skip
-"""Illuminants with a name; beside them "6500K", a daylight, and 36 values of relative power."""
+"""Illuminants with a name; beside them "6500K", a daylight, and 36 values of relative power.
+
+Daylight is defined from 4000K to 25000K; beyond, it is extrapolated without a warning, and the white
+of 1000K has a negative Z.
+"""

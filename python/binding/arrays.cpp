@@ -5,11 +5,13 @@
 #include <limits>
 #include <optional>
 #include <string>
+#include <vector>
 
 #include <pybind11/numpy.h>
 #include <pybind11/stl.h>
 
 #include "aldermoor/measure/context.h"
+#include "aldermoor/measure/words.h"
 
 #include "lock.h"
 #include "module.h"
@@ -142,7 +144,8 @@ values: float32, shape (n, 36): spectra at 380 nm to 730 nm by 10 nm; with a col
     of rows, and the result has none then either.
 illuminant: "D65", "F11" ..., a daylight as "6500K", or 36 numbers of relative power.  Colours are
     taken as those of this illuminant, not adapted to it.  "Emission" makes the spectra those of
-    lights.
+    lights.  Daylight is defined from 4000K to 25000K; beyond, it is extrapolated without a
+    warning, and the white of 1000K has a negative Z.
 source: "Spectrum" for reflectances, 1 = perfect reflector; "Emission" for lights, whose colours
     are their own whatever the illuminant; or the colour space of `values`.
 paper: 36 reflectances to which the colours are relative, except those of lights.
@@ -273,6 +276,16 @@ py::tuple Channels(const std::string& space) {
   return py::tuple(py::cast(LabelsOf(space)));
 }
 
+constexpr const char* kWordsOf = R"(_words_of(key)
+--
+
+The words of the library for a key of the conditions, in order.)";
+
+py::tuple WordsOf(const std::string& key) {
+  const auto words = Measure::WordsOf(key);
+  return py::tuple(py::cast(std::vector<std::string>(words.begin(), words.end())));
+}
+
 }  // namespace
 
 void AddArrays(py::module_& module) {
@@ -287,6 +300,7 @@ void AddArrays(py::module_& module) {
   module.def("density", &Density, kDensity, arg("values"), arg("standard") = "DIN", py::kw_only(),
              arg("paper") = py::none(), arg("out") = py::none());
   module.def("channels", &Channels, kChannels, arg("space"));
+  module.def("_words_of", &WordsOf, kWordsOf, arg("key"));
 }
 
 }  // namespace Aldermoor::Python

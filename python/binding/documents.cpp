@@ -331,7 +331,9 @@ void AddSampleClass(py::module_& module) {
 The colour of the sample: a stored one that was measured so, else one computed from the spectrum,
 else one converted from a stored one.
 
-illuminant: "D65", "F11" ..., a daylight as "6500K", or 36 numbers of relative power.
+illuminant: "D65", "F11" ..., a daylight as "6500K", or 36 numbers of relative power.  Daylight is
+    defined from 4000K to 25000K; beyond, it is extrapolated without a warning, and the white of
+    1000K has a negative Z.
 paper: 36 reflectances to which the colour is relative.
 
 Returns float32, shape (channels,).

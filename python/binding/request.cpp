@@ -9,6 +9,7 @@
 
 #include <pybind11/stl.h>
 
+#include "aldermoor/measure/words.h"
 #include "aldermoor/vexdoc/colorvector.h"
 
 namespace Aldermoor::Python {
@@ -45,10 +46,11 @@ std::string IlluminationOf(const std::string& word) {
 }  // namespace
 
 void CheckWord(const char* argument, const std::string& word, const char* list) {
-  const py::tuple words = py::module_::import("aldermoor._words").attr(list);
-  if (!words.contains(word)) {
-    throw py::value_error(std::string(argument) + ": '" + word + "' is none of " +
-                          py::str(", ").attr("join")(words).cast<std::string>());
+  const py::tuple tuple = py::module_::import("aldermoor._words").attr(list);
+  if (!tuple.contains(word)) {
+    const auto texts = tuple.cast<std::vector<std::string>>();
+    const std::vector<std::string_view> words(texts.begin(), texts.end());
+    throw py::value_error(Measure::NoSuchWord(argument, word, words));
   }
 }
 

@@ -54,7 +54,9 @@ Correlated colour temperatures of lights in whole kelvin.
 
 values: float32, shape (n, 36) or (36,): power at 380 nm to 730 nm by 10 nm, in any unit.
 
-Returns float32, shape (n,), or `out`; NaN for a light without a colour temperature.)";
+Returns float32, shape (n,), or `out`; NaN for a light without a colour temperature.
+Raises MeasureError for such a light under "TenDegree": for that observer the search misses the
+upper end of the black-body locus, and white lights have no temperature.)";
 
 FloatArray ColorTemperature(const py::object& values, const std::string& observer,
                             const py::object& out) {
@@ -104,8 +106,11 @@ constexpr const char* kReconstruct =
     R"(reconstruct(colors, source="CIELab", *, illuminant="D50", observer="TwoDegree", out=None)
 --
 
-Smooth reflectance spectra for colours, whose CIELab differs from that of the colour by less
-than 0.1.
+Reflectance spectra for colours, whose CIELab differs from that of the colour by less than 0.1.
+
+A spectrum is one of the many with that colour, not that of any real surface: jagged, since a
+search moves one band after the other away from a grey of 0.5, and a match under this illuminant
+and observer only.
 
 colors: float32, shape (n, 3) or (3,).
 source: their colour space: "CIELab", "CIEXYZ" or "RGB".

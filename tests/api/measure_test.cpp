@@ -2,6 +2,7 @@
 // installed headers, linked to the shared library alone.
 
 #include <cmath>
+#include <optional>
 #include <string>
 #include <vector>
 
@@ -11,62 +12,17 @@
 #include "aldermoor/measure/density.h"
 #include "aldermoor/measure/judgement.h"
 #include "aldermoor/measure/light.h"
-#include "aldermoor/measure/measureexception.h"
 #include "aldermoor/measure/paperwhite.h"
 #include "aldermoor/measure/printcontrol.h"
 #include "aldermoor/vexdoc/sample.h"
 
+#include "measuresupport.h"
+
 namespace {
 
-using namespace Aldermoor::Measure;
-using namespace Aldermoor::Vexdoc;
+using namespace MeasureTests;
 using Aldermoor::Utilities::Exceptions::ResourceNotAvailableException;
 using Aldermoor::Utilities::Tools::SmartPointer;
-
-Conditions Of(const std::vector<std::pair<std::string, std::string>>& words) {
-  Conditions conditions;
-  conditions.AddAttribute("Physical.WavelengthSpectrumMin", "380nm");
-  conditions.AddAttribute("Physical.WavelengthSpectrumMax", "730nm");
-  conditions.AddAttribute("Physical.NumberOfDataPointsSpectrum", "36");
-  conditions.AddAttribute("Physical.SpectrumType", "Remission");
-  conditions.AddAttribute("Colorimetric.Observer", "TwoDegree");
-  for (const auto& [key, value] : words) {
-    conditions.AddAttribute(key, value);
-  }
-  return conditions;
-}
-
-const std::string kLight = "Colorimetric.Illumination";
-const std::string kBase = "Colorimetric.WhiteBase";
-const std::string kSpace = "ColorSpaceDescription.Type";
-const std::string kFormula = "ColorSpaceDescription.DeltaEFormula";
-
-Spectrum Flat(float value, const Conditions& conditions = Of({})) {
-  return {conditions, std::vector<float>(36, value)};
-}
-
-/// 36 values, `value` from band 20 (580 nm) on and 1 before: a cyan of that reflectance.
-Spectrum Cyan(float value) {
-  std::vector<float> values(36, 1.0F);
-  std::fill(values.begin() + 20, values.end(), value);
-  return {Of({}), values};
-}
-
-ColorVector Lab(float l, float a, float b, const std::string& formula = "CIELab",
-                const std::string& space = "CIELab") {
-  return {Of({{kLight, "D50"}, {kSpace, space}, {kFormula, formula}}), {l, a, b}};
-}
-
-/// The message of the MeasureException of `action`.
-template <class Action>
-std::string ReasonOf(Action action) {
-  try {
-    action();
-  } catch (const MeasureException& e) {
-    return e.what();
-  }
-  return "nothing was thrown";
-}
 
 TEST(MeasureTest, DifferencesOfColorsAndSpectra) {
   EXPECT_NEAR(ColorDifference(Lab(50, 3, 4), Lab(50, 0, 0)), 5.0, 1e-5);
@@ -79,6 +35,9 @@ TEST(MeasureTest, DifferencesOfColorsAndSpectra) {
   EXPECT_NEAR(delta.GetDatastore()[0].second, 10.0, 1e-5);
   EXPECT_NEAR(delta.GetDatastore()[1].second, 5.0, 1e-5);
   EXPECT_EQ(delta.GetConditions()->GetAttribute(kSpace), "CIELCh");
+  EXPECT_EQ(delta.GetConditions()->GetAttribute("ColorSpaceDescription.AbsoluteOrDeltaVector"),
+            "DeltaVector");
+  EXPECT_EQ(delta.GetDatastore()[2].first, "delta H*");
 
   EXPECT_EQ(ReasonOf([] { ColorDifference(Lab(1, 2, 3, "LABhx"), Lab(1, 2, 3)); }),
             "the colour difference \"LABhx\" of two colours cannot be computed");
@@ -92,6 +51,11 @@ TEST(MeasureTest, DifferencesOfColorsAndSpectra) {
             "the colour difference \"CIELab\" cannot be computed: the white base is \"Paper\" and "
             "there is no paper white");
   EXPECT_EQ(ReasonOf([] { DifferenceVector(Lab(1, 2, 3, "94", "CIEXYZ"), Lab(1, 2, 3)); }),
+            "there is no difference vector of a colour in \"CIEXYZ\" and one in \"CIELab\"");
+  EXPECT_EQ(ReasonOf([] {
+              const ColorVector xyz = Lab(1, 2, 3, "94", "CIEXYZ");
+              DifferenceVector(xyz, xyz);
+            }),
             "there is no difference vector in the colour space \"CIEXYZ\"");
 }
 
@@ -136,11 +100,62 @@ TEST(MeasureTest, LightsHaveATemperatureAndAnIndex) {
   const ColorRendering rendering = ColorRenderingOf(Flat(1, emission));
   EXPECT_NEAR(rendering.index, 95.0F, 1.0F);
   EXPECT_EQ(rendering.reference, "D55");
-  const Spectrum odd(Of({}), std::vector<float>(35, 1.0F));
+  const Spectrum odd(emission, std::vector<float>(35, 1.0F));
   EXPECT_EQ(ReasonOf([&] { (void)ColorTemperature(odd); }),
             ReasonOf([&] { ColorRenderingOf(odd); }));
   EXPECT_NE(ReasonOf([&] { (void)ColorTemperature(odd); }).find("spectrum size"),
             std::string::npos);
+}
+
+/// Relative power of a black body, by Planck's law with the constants of the library.
+Spectrum BlackBody(double kelvin, const Conditions& conditions, double scale = 1.0) {
+  std::vector<float> values;
+  for (int i = 0; i < 36; ++i) {
+    const double metres = (380 + 10 * i) * 1e-9;
+    values.push_back(static_cast<float>(scale * 1.19104678203084e-16 / std::pow(metres, 5) /
+                                        (std::exp(0.014388443415906128 / (kelvin * metres)) - 1)));
+  }
+  return {conditions, values};
+}
+
+// Some stand on the locus to the last bit of u and v, where there is no direction towards it.
+TEST(MeasureTest, BlackBodiesHaveTheirTemperatureAndAnIndex) {
+  const Conditions emission = Of({{kLight, "Emission"}});
+  for (int kelvin = 1000; kelvin <= 20000; kelvin += 10) {
+    const Spectrum light = BlackBody(kelvin, emission);
+    EXPECT_NEAR(ColorTemperature(light).value_or(0.0F), kelvin, 1 + kelvin * 1e-4) << kelvin;
+    const ColorRendering rendering = ColorRenderingOf(light);
+    const ColorRendering scaled = ColorRenderingOf(BlackBody(kelvin, emission, 1000.0));
+    EXPECT_GT(rendering.index, 0.0F) << kelvin;
+    EXPECT_NEAR(rendering.index, scaled.index, 1.0) << kelvin;
+    EXPECT_EQ(rendering.reference, scaled.reference) << kelvin;
+  }
+}
+
+// The search ends where the locus hardly moves, at half a million kelvin.
+TEST(MeasureTest, DeepRedsHaveNoTemperature) {
+  const Conditions emission = Of({{kLight, "Emission"}});
+  std::vector<float> red(36, 0.0F);
+  red[34] = 1.0F;  // 720 nm alone
+  EXPECT_EQ(ColorTemperature({emission, red}), std::nullopt);
+  EXPECT_EQ(ColorTemperature(BlackBody(985, emission)), std::nullopt);
+  red[34] = 0.0F;
+  red[20] = 1.0F;  // 580 nm alone, beside the locus
+  EXPECT_NEAR(ColorTemperature({emission, red}).value_or(0.0F), 2589, 1);
+}
+
+TEST(MeasureTest, SaysWhyALightHasNeitherTemperatureNorIndex) {
+  const Conditions ten = Of({{kLight, "Emission"}, {"Colorimetric.Observer", "TenDegree"}});
+  const std::string why =
+      "under the observer \"TenDegree\" the search for the colour temperature does not find the "
+      "upper end of the black-body locus; ask for \"TwoDegree\"";
+  EXPECT_EQ(ReasonOf([&] { (void)ColorTemperature(Flat(1, ten)); }), why);
+  EXPECT_EQ(ReasonOf([&] { ColorRenderingOf(Flat(1, ten)); }), why);
+  EXPECT_FALSE(ColorTemperature(Flat(0, ten))) << "dark";
+  EXPECT_FALSE(ColorTemperature(Flat(std::nanf(""), ten)));
+  EXPECT_EQ(ReasonOf([] { ColorRenderingOf(Flat(1)); }),
+            "the colour rendering index is that of a light, and the conditions of this spectrum do "
+            "not say \"Emission\" under \"Colorimetric.Illumination\"");
 }
 
 TEST(MeasureTest, DensitiesAndTheirCalibration) {
@@ -151,8 +166,13 @@ TEST(MeasureTest, DensitiesAndTheirCalibration) {
   EXPECT_NEAR(reported.value, 1.0, 2e-3);
   EXPECT_NEAR(DensitySpectrumOf(Cyan(0.1F), false)[35], 1.0, 1e-6);
   EXPECT_EQ(MaximumDensityOf(Cyan(0.1F), false).wavelength, 580U);
-  EXPECT_EQ(ReasonOf([] { DensityStandardOf("DIN 1"); }), "'DIN 1' is no density standard");
-  EXPECT_EQ(ReasonOf([] { DensityModeOf("Red"); }), "'Red' is no density filter mode");
+  EXPECT_EQ(ReasonOf([] { DensityStandardOf("DIN 1"); }),
+            "Colorimetric.DensityStandard: 'DIN 1' is not one of DIN, DINNB, ANSIA, ANSIE, ANSII, "
+            "ANSIT, SPI, User; did you mean 'DIN'?");
+  EXPECT_EQ(
+      ReasonOf([] { DensityModeOf("Red"); }),
+      "Colorimetric.DensityFilterMode: 'Red' is not one of Black, Cyan, Magenta, Yellow, Max, "
+      "Auto");
   EXPECT_EQ(ReasonOf([&] { DensityOf(Flat(1), DensityMode::Max, options); }),
             "the densest band belongs to no channel");
 
@@ -187,7 +207,6 @@ TEST(MeasureTest, DensitiesAndTheirCalibration) {
 
 TEST(MeasureTest, PrintControlRelativeToNestedPapers) {
   constexpr auto kMode = DensityMode::Cyan;
-  constexpr auto kDin = DensityStandard::DIN;
   const auto area = [] {
     return DotArea(Cyan(0.1F), Cyan(0.55F), kMode, kDin);
   };

@@ -117,29 +117,6 @@ TEST(ContextBitsTest, OfColorsFromSpectra) {
   }
 }
 
-TEST(ContextBitsTest, OfEmissionAndRelativeToPaper) {
-  Numbers numbers(2);
-  const std::vector<float> spectra = numbers.Spectra(2000);
-  std::array<float, kBands> paper;
-  for (float& value : paper) {
-    value = numbers.Uniform(0.0F, 1.0F);
-  }
-  paper[3] = 0.0F;
-  const PaperWhite held(Reflectance({paper.begin(), paper.end()}));
-  const Conditions emission = Words({{kIllumination, "Emission"}});
-  for (const char* const space : kSpectrumSpaces) {
-    for (const bool is_emission : {true, false}) {
-      SCOPED_TRACE(space);
-      const Conditions source = is_emission ? emission : Conditions();
-      const Conditions target =
-          Words({{kIllumination, "F11 "}, {kWhiteBase, "Paper"}, {kSpace, space}});
-      const Context context(target, source, paper);
-      ExpectBits(SingleColors(spectra, kBands, target, source), kChannels,
-                 [&](std::span<float> colors) { context.ConvertSpectra(spectra, colors); });
-    }
-  }
-}
-
 /// XYZ of the rows and of their neighbourhood.
 std::vector<float> SomeXyz(Numbers& numbers, std::size_t rows) {
   std::vector<float> xyz(3 * rows);
@@ -224,6 +201,56 @@ TEST(ContextBitsTest, OfDifferencesOfSpectra) {
       ExpectBits(expected, 1, [&](std::span<float> differences) {
         EXPECT_EQ(context.CompareSpectra(first, second, differences, w), failed);
       });
+    }
+  }
+}
+
+// Reflectances and lights, some of them black, under every illuminant and white.
+TEST(ContextBitsTest, OfEveryIlluminantWhiteBaseAndSource) {
+  constexpr std::size_t kRows = 34;
+  Numbers numbers(2);
+  std::vector<float> spectra = numbers.Spectra(kRows - 2);
+  spectra.insert(spectra.begin(), kBands, 0.0F);
+  spectra.insert(spectra.begin(), kBands, -0.0F);
+  std::array<float, kBands> paper;
+  for (float& value : paper) {
+    value = numbers.Uniform(0.0F, 1.0F);
+  }
+  const PaperWhite held(Reflectance({paper.begin(), paper.end()}));
+  for (const Conditions& light : AllLights()) {
+    for (const char* const base : {"Absolute", "Paper", "Automatic"}) {
+      for (const char* const kind : {"D65", "Emission"}) {
+        const Conditions source = Words({{kIllumination, kind}});
+        SCOPED_TRACE(light.GetAttribute(kIllumination) + " " + base + " of " + kind);
+        for (const char* const space : kSpectrumSpaces) {
+          SCOPED_TRACE(space);
+          const Conditions target = With(With(light, kWhiteBase, base), kSpace, space);
+          const Context context(target, source, paper);
+          ExpectBits(SingleColors(spectra, kBands, target, source), kChannels,
+                     [&](std::span<float> colors) { context.ConvertSpectra(spectra, colors); });
+        }
+        for (const char* const formula : kFormulas) {
+          SCOPED_TRACE(formula);
+          const Conditions target = With(With(light, kWhiteBase, base), kFormula, formula);
+          const HXMeasureConditions asked = Vexdoc::ToMeasureConditions(target);
+          const HXMeasureConditions own = Vexdoc::ToMeasureConditions(source);
+          const auto expected = SingleDifferences(kRows, [&](std::size_t row) {
+            return TristimService::GetDeltaE(
+                HXSpectrum(spectra.data() + row * kBands, own),
+                HXSpectrum(spectra.data() + (kRows - 1 - row) * kBands, own), asked, 0.0F, 0.0F,
+                0.0F);
+          });
+          std::vector<float> reversed;
+          for (std::size_t row = kRows; row-- > 0;) {
+            const auto begin = spectra.begin() + static_cast<std::ptrdiff_t>(row * kBands);
+            reversed.insert(reversed.end(), begin, begin + kBands);
+          }
+          const Context context(target, source, paper);
+          ExpectBits(expected, 1, [&](std::span<float> differences) {
+            context.CompareSpectra(spectra, reversed, differences);
+          });
+        }
+      }
     }
   }
 }

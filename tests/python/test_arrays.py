@@ -260,6 +260,15 @@ def planck(kelvin: float) -> Floats:
     return numpy.asarray(power / power.max(), numpy.float32)
 
 
+def test_lights_on_the_locus_have_a_temperature_and_the_ten_degree_observer_is_named() -> None:
+    kelvins = numpy.arange(5000, 15000, 10)
+    lights = numpy.stack([planck(kelvin) for kelvin in kelvins])
+    numpy.testing.assert_allclose(aldermoor.color_temperature(lights), kelvins, rtol=0.001)
+    assert (aldermoor.color_rendering(lights).ra > 0).all()
+    with pytest.raises(aldermoor.MeasureError, match="TenDegree.* ask for .TwoDegree"):
+        aldermoor.color_temperature(lights, observer="TenDegree")
+
+
 def test_black_bodies_have_their_temperature() -> None:
     kelvins = (2000, 2856, 4000, 6000)
     lights = numpy.stack([planck(kelvin) for kelvin in kelvins])

@@ -66,7 +66,7 @@ def test_the_range_is_taken_from_points_with_one_step() -> None:
     assert range_of(aldermoor.loads(document.dumps())) == ("400nm", "750nm")
     with pytest.raises(aldermoor.WavelengthError, match="no one step"):
         aldermoor.loads(xml([380, 400, 410], "380nm", "410nm"), wavelengths="complete")
-    with pytest.raises(ValueError, match="wavelengths: 'guess' is none of check, complete"):
+    with pytest.raises(ValueError, match="wavelengths: 'guess' is not one of check, complete"):
         aldermoor.loads(SHIFTED, wavelengths="guess")  # type: ignore[arg-type]
 
 
@@ -97,7 +97,7 @@ def test_missing_conditions_are_completed_or_told() -> None:
     ):
         aldermoor.loads(legacy, complete=given)
     for wrong in ({"Colorimetric.Illumination": "D5O"}, {"Observer": "TwoDegree"}):
-        with pytest.raises(ValueError, match=r"none of|neither kind"):
+        with pytest.raises(ValueError, match=r"not one of|neither kind"):
             aldermoor.loads(legacy, complete=wrong)
 
 

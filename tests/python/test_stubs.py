@@ -72,3 +72,20 @@ def test_classes_have_what_the_stubs_say(name: str) -> None:
             # As the method of an object, whichever it is.
             assert parameters(MethodType(function, object())) == stub_parameters(node), key
         assert key.startswith("__") or getattr(found, key).__doc__, key
+
+
+@pytest.mark.parametrize(
+    ("key", "words", "left_out"),
+    [
+        ("ColorSpaceDescription.Type", aldermoor.COLOR_SPACES, ()),
+        ("ColorSpaceDescription.DeltaEFormula", aldermoor.FORMULAS, ()),
+        ("Colorimetric.Observer", aldermoor.OBSERVERS, ()),
+        ("Colorimetric.Illumination", aldermoor.ILLUMINANTS, ("Userdefined",)),
+        ("Colorimetric.DensityStandard", aldermoor.DENSITY_STANDARDS, ("User",)),
+        ("Physical.SpectrumType", aldermoor.SPECTRUM_TYPES, ()),
+    ],
+)
+def test_words_are_those_of_the_library(
+    key: str, words: tuple[str, ...], left_out: tuple[str, ...]
+) -> None:
+    assert (*words, *left_out) == _core._words_of(key)

@@ -15,6 +15,7 @@ constexpr Wrong kWrong[] = {
     {"paint a.xml", "paint"},
     {"color a.xml --colour RGB", "--colour"},
     {"color a.xml --space cielab", "'cielab' is not one of CIELab, CIELCh, CIELuv"},
+    {"color a.xml --space XYZ", "LABhx, LCHhx, RGB, CMYK; did you mean 'CIEXYZ'?"},
     {"color a.xml --space Undefined", "'Undefined' is not one of"},
     {"color a.xml --observer 2", "TwoDegree, TenDegree"},
     {"color a.xml --white-base paper", "Absolute, Paper, Automatic"},

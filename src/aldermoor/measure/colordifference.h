@@ -10,6 +10,11 @@
 ///
 /// Nothing here keeps or changes a document.  Like all colorimetry of the library, the functions
 /// use state of the process: one thread at a time.
+///
+/// A word that colorimetry does not know, in conditions that decide a result, is a MeasureException
+/// with the words that would do (words.h), and so is an illumination "Userdefined" without a curve
+/// of 36 values.  Requests of a sample put their default in the place of such a word.  A daylight
+/// outside 4000 K to 25000 K is extrapolated without a warning (words.h).
 namespace Aldermoor::Measure {
 
 /// Weights of a difference formula, in its own order: l and c of "CMC", kL, kC and kH of "94" and
@@ -36,8 +41,9 @@ ALDERMOOR_EXPORT float ColorDifference(const Vexdoc::ColorVector& first,
                                        const DifferenceWeights& weights = {});
 
 /// Differences of lightness, chroma and hue, `first` minus `second`, of two colours in "CIELab",
-/// "CIELuv" or "LABhx", as a colour in the polar form of that space.
-/// Throws: MeasureException for other colour spaces.
+/// "CIELuv" or "LABhx", in the polar form of that space, as a "DeltaVector" with the labels of
+/// differences, such as "delta H*".
+/// Throws: MeasureException for other colour spaces, and for colours in two.
 ALDERMOOR_EXPORT Vexdoc::ColorVector DifferenceVector(const Vexdoc::ColorVector& first,
                                                       const Vexdoc::ColorVector& second);
 

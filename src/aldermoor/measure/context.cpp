@@ -4,6 +4,7 @@
 #include <string>
 #include <string_view>
 
+#include "aldermoor/measure/densitysupport.h"
 #include "aldermoor/measure/support.h"
 #include "aldermoor/tristim/internals/batchconversion.h"
 #include "aldermoor/tristim/internals/batchdifference.h"
@@ -36,6 +37,13 @@ using Block = std::array<float, 3 * kBlock>;
 
 [[noreturn]] void Fail(const std::string& reason) {
   throw MeasureException(reason, ALDERMOOR_HERE(Aldermoor::Measure::Context));
+}
+
+HXMeasureConditions Checked(const Vexdoc::Conditions& conditions,
+                            std::initializer_list<std::string_view> keys) {
+  CheckViewing(conditions);
+  CheckWords(conditions, keys);
+  return Vexdoc::ToMeasureConditions(conditions);
 }
 
 /// A value, or the reason why there is none, which is told to those who ask for it.
@@ -160,11 +168,7 @@ const DensityFilter& DensityFilterOf(DensityStandard standard) {
   if (standard == DensityStandard::User) {
     Fail("the density standard \"User\" has curves of the process, which a context does not use");
   }
-  const auto number = static_cast<std::size_t>(standard);
-  if (number >= filters.size()) {
-    Fail("there is no density standard " + std::to_string(static_cast<int>(standard)));
-  }
-  return filters[number];
+  return filters[static_cast<std::size_t>(NumberOf(standard))];
 }
 
 }  // namespace
@@ -232,8 +236,9 @@ struct Context::Plan {
 
 Context::Context(const Vexdoc::Conditions& target, const Vexdoc::Conditions& source,
                  const std::optional<Bands>& paper_white) try
-    : plan_(std::make_shared<const Plan>(Vexdoc::ToMeasureConditions(target),
-                                         Vexdoc::ToMeasureConditions(source), paper_white)) {}
+    : plan_(std::make_shared<const Plan>(
+          Checked(target, {Words::kColorSpaceKey, Words::kDeltaEFormulaKey}),
+          Checked(source, {Words::kColorSpaceKey}), paper_white)) {}
 ALDERMOOR_FRAME(Aldermoor::Measure::Context::Context)
 
 std::size_t Context::GetSourceChannels() const {

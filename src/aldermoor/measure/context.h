@@ -56,12 +56,15 @@ struct SpectrumRows {
 /// results that are none, but 255 in "RGB" and the greatest value in a density.
 ///
 /// Throws: MeasureException where a single request would fail for every row, with its reason, and
-/// for arrays whose lengths do not fit; the output is unchanged then.
+/// for arrays whose lengths do not fit; the output is unchanged then.  Making one throws it for a
+/// word that colorimetry does not know (words.h), and for an illumination "Userdefined" without a
+/// curve of 36 values.
 class ALDERMOOR_EXPORT Context {
  public:
   /// `target`: what is asked for, by the words of the library: colour space, illuminant, observer,
   /// white base and difference formula; as for a request, D65, two-degree, CIELab and "Automatic"
-  /// stand for what is not said.
+  /// stand for what is not said.  A daylight outside 4000 K to 25000 K is extrapolated without a
+  /// warning (words.h).
   /// `source`: what the arrays hold.  For spectra, whether the illumination is "Emission"; for
   /// colours, all that stands for `target` too.
   /// `paper_white`: the paper that the white base "Paper" refers to.

@@ -5,7 +5,9 @@
 #include <string_view>
 
 #include "aldermoor/measure/densitysupport.h"
+#include "aldermoor/measure/words.h"
 #include "aldermoor/tristim/internals/densitycalculator.h"
+#include "aldermoor/tristim/internals/vocabulary.h"
 
 namespace Aldermoor::Measure {
 
@@ -14,28 +16,36 @@ using Tristim::Internals::DensityCalculator;
 using Tristim::Internals::DensityFilter;
 using Tristim::Internals::HXDensity;
 using Vexdoc::Spectrum;
+namespace Vocabulary = Tristim::Vocabulary;
 
 namespace {
 
-// Index: value of the enumeration.
-constexpr const char* kStandards[] = {"DIN",   "DINNB", "ANSIA", "ANSIE",
-                                      "ANSII", "ANSIT", "SPI",   "User"};
-constexpr const char* kModes[] = {"Black", "Cyan", "Magenta", "Yellow", "Max", "Auto"};
-
-template <class Enum, std::size_t kCount>
-Enum ValueOf(const char* const (&words)[kCount], const std::string& word, const char* what) {
-  const auto* const found = std::find(std::begin(words), std::end(words), std::string_view(word));
-  if (found == std::end(words)) {
-    throw MeasureException("'" + word + "' is no density " + what,
-                           ALDERMOOR_HERE(Aldermoor::Measure));
+/// The values of the enumerations are the places of their words.
+template <class Enum>
+Enum ValueOf(std::string_view key, const std::string& word) {
+  const auto words = WordsOf(key);
+  const auto found = std::ranges::find(words, std::string_view(word));
+  if (found == words.end()) {
+    throw MeasureException(NoSuchWord(key, word, words), ALDERMOOR_HERE(Aldermoor::Measure));
   }
-  return static_cast<Enum>(found - std::begin(words));
+  return static_cast<Enum>(found - words.begin());
+}
+
+template <class Enum>
+int NumberUpTo(Enum last, Enum value, const char* what) {
+  const int number = static_cast<int>(value);
+  if (number < 0 || number > static_cast<int>(last)) {
+    throw MeasureException(
+        std::string("there is no density ") + what + " " + std::to_string(number),
+        ALDERMOOR_HERE(Aldermoor::Measure));
+  }
+  return number;
 }
 
 int FilterOf(const std::string& word) {
+  CheckWord(Vocabulary::kFilterKey, word);
   HXMeasureConditions conditions;
-  Computed([&] { conditions.SetMeasureCondition("Physical.Filter", word); },
-           [] { return std::string(); });
+  conditions.SetMeasureCondition(Vocabulary::kFilterKey, word);
   return static_cast<int>(conditions.GetPhysicalFilter());
 }
 
@@ -62,21 +72,41 @@ Densities Measured(DensityFunction measure, const Spectrum& spectrum,
 
 }  // namespace
 
+int NumberOf(DensityStandard standard) {
+  return NumberUpTo(DensityStandard::User, standard, "standard");
+}
+
+int NumberOf(DensityMode mode) {
+  return NumberUpTo(DensityMode::Auto, mode, "filter mode");
+}
+
+int NumberOf(DensityChannel channel) {
+  return NumberUpTo(DensityChannel::Yellow, channel, "channel");
+}
+
 DensityStandard DensityStandardOf(const std::string& word) try {
-  return ValueOf<DensityStandard>(kStandards, word, "standard");
+  return ValueOf<DensityStandard>(Vocabulary::kDensityStandardKey, word);
 }
 ALDERMOOR_FRAME(Aldermoor::Measure::DensityStandardOf)
 
 DensityMode DensityModeOf(const std::string& word) try {
-  return ValueOf<DensityMode>(kModes, word, "filter mode");
+  return ValueOf<DensityMode>(Vocabulary::kDensityFilterModeKey, word);
 }
 ALDERMOOR_FRAME(Aldermoor::Measure::DensityModeOf)
 
-const char* NameOf(DensityChannel channel) {
-  return kModes[static_cast<std::size_t>(channel)];
+const char* NameOf(DensityChannel channel) try {
+  const auto words = WordsOf(Vocabulary::kDensityFilterModeKey);
+  return words[static_cast<std::size_t>(NumberOf(channel))].data();  // of a literal
 }
+ALDERMOOR_FRAME(Aldermoor::Measure::NameOf)
+
+float Densities::Of(DensityChannel channel) const try {
+  return ToArray(*this)[static_cast<std::size_t>(NumberOf(channel))];
+}
+ALDERMOOR_FRAME(Aldermoor::Measure::Densities::Of)
 
 Densities DensitiesOf(const Spectrum& spectrum, const DensityOptions& options) try {
+  CheckFilter(spectrum);
   return Measured(DensityCalculator::GetDensityVectorWithSlope, spectrum, options);
 }
 ALDERMOOR_FRAME(Aldermoor::Measure::DensitiesOf)
@@ -88,6 +118,7 @@ ALDERMOOR_FRAME(Aldermoor::Measure::UncalibratedDensitiesOf)
 
 ChannelDensity DensityOf(const Spectrum& spectrum, DensityMode mode,
                          const DensityOptions& options) try {
+  CheckFilter(spectrum);
   if (mode == DensityMode::Max) {
     throw MeasureException("the densest band belongs to no channel",
                            ALDERMOOR_HERE(Aldermoor::Measure::DensityOf));
@@ -144,14 +175,13 @@ ALDERMOOR_FRAME(Aldermoor::Measure::SetDensityCalibration)
 
 std::array<float, 36> GetUserDensityCurve(DensityChannel channel) try {
   std::array<float, 36> curve;
-  std::copy_n(DensityFilter::GetUserDefinedFilter(static_cast<int>(channel)), curve.size(),
-              curve.begin());
+  std::copy_n(DensityFilter::GetUserDefinedFilter(NumberOf(channel)), curve.size(), curve.begin());
   return curve;
 }
 ALDERMOOR_FRAME(Aldermoor::Measure::GetUserDensityCurve)
 
 void SetUserDensityCurve(DensityChannel channel, std::span<const float, 36> curve) try {
-  DensityFilter::SetUserDefinedFilter(curve.data(), static_cast<int>(channel));
+  DensityFilter::SetUserDefinedFilter(curve.data(), NumberOf(channel));
   ForgetActiveFilter();
 }
 ALDERMOOR_FRAME(Aldermoor::Measure::SetUserDensityCurve)

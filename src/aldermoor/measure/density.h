@@ -19,10 +19,11 @@ enum class DensityMode { Black = 0, Cyan, Magenta, Yellow, Max, Auto };
 
 enum class DensityChannel { Black = 0, Cyan, Magenta, Yellow };
 
-/// The value for a word such as "ANSIT" or "Auto".  Throws: MeasureException for any other.
+/// The value for a word such as "ANSIT" or "Auto".  Throws: MeasureException for any other, with
+/// those that would do.
 ALDERMOOR_EXPORT DensityStandard DensityStandardOf(const std::string& word);
 ALDERMOOR_EXPORT DensityMode DensityModeOf(const std::string& word);
-/// "Black", "Cyan", "Magenta", "Yellow".
+/// "Black", "Cyan", "Magenta", "Yellow".  Throws: MeasureException for a value that is none.
 ALDERMOOR_EXPORT const char* NameOf(DensityChannel channel);
 
 /// The four densities of a field.
@@ -32,19 +33,8 @@ struct Densities {
   float magenta = 0.0F;
   float yellow = 0.0F;
 
-  float Of(DensityChannel channel) const {
-    switch (channel) {
-      case DensityChannel::Cyan:
-        return cyan;
-      case DensityChannel::Magenta:
-        return magenta;
-      case DensityChannel::Yellow:
-        return yellow;
-      case DensityChannel::Black:
-        break;
-    }
-    return black;
-  }
+  /// Throws: MeasureException for a value that is no channel.
+  ALDERMOOR_EXPORT float Of(DensityChannel channel) const;
 };
 
 /// How densities are to be taken.
@@ -67,7 +57,8 @@ struct MaximumDensity {
 
 /// All functions below take a reflectance spectrum of 36 values.  A reflectance of 0 or below has
 /// the density 9.99, the visual channel then 11.99. Throws: MeasureException for another length,
-/// and without a paper white where one is needed.
+/// without a paper white where one is needed, for a value that its enumeration does not have, and,
+/// where the calibration is put on, for an unknown word under "Physical.Filter".
 ///
 /// The calibration of the physical filter and standard is put on where it says so.
 
@@ -91,7 +82,8 @@ ALDERMOOR_EXPORT MaximumDensity MaximumDensityOf(const Vexdoc::Spectrum& spectru
 /// Slope and offset of the densities that are measured through a physical filter ("No", "Polarizer"
 /// ..., the words of "Physical.Filter").  At the start 1 and 0.
 /// Shared state: that of the process.
-/// Throws: MeasureException for an unknown word.
+/// Throws: MeasureException for an unknown word, with those that would do, and a standard that is
+/// none.
 struct DensityCalibration {
   Densities slope = {1.0F, 1.0F, 1.0F, 1.0F};
   Densities offset;  ///< not used relative to paper
@@ -105,7 +97,7 @@ ALDERMOOR_EXPORT void SetDensityCalibration(const std::string& physical_filter,
 /// The curves of the standard "User": weights on reflectance, 380 nm to 730 nm, 10 nm.  The visual
 /// one adds up to 100 and the others to 1 for densities of 0 on white.  At the start all are 0; a
 /// curve that is set is in force at once.
-/// Shared state: that of the process.
+/// Shared state: that of the process.  Throws: MeasureException for a value that is no channel.
 ALDERMOOR_EXPORT std::array<float, 36> GetUserDensityCurve(DensityChannel channel);
 ALDERMOOR_EXPORT void SetUserDensityCurve(DensityChannel channel, std::span<const float, 36> curve);
 /// Sets every value of every curve to 1.

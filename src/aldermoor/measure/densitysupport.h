@@ -5,14 +5,21 @@
 #include "aldermoor/measure/support.h"
 #include "aldermoor/tristim/hxspectrum.h"
 #include "aldermoor/tristim/internals/densitycalculator.h"
+#include "aldermoor/tristim/internals/vocabulary.h"
 #include "aldermoor/vexdoc/colorimetrybridge.h"
 
 /// What the functions on densities share; not installed.
 namespace Aldermoor::Measure {
 
-template <class Enum>
-int NumberOf(Enum value) {
-  return static_cast<int>(value);
+/// The numbers of colorimetry, which does not check them.
+/// Throws: MeasureException for a value that the enumeration does not have.
+int NumberOf(DensityStandard standard);
+int NumberOf(DensityMode mode);
+int NumberOf(DensityChannel channel);
+
+/// Throws: MeasureException if the physical filter, whose calibration is put on, is none.
+inline void CheckFilter(const Vexdoc::Spectrum& spectrum) {
+  CheckWords(*spectrum.GetConditions(), {Tristim::Vocabulary::kFilterKey});
 }
 
 /// Runs `compute`, whose only cause of false is a missing paper white.

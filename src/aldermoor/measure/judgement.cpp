@@ -5,6 +5,7 @@
 #include "aldermoor/tristim/hxspectrum.h"
 #include "aldermoor/tristim/internals/deltaemath.h"
 #include "aldermoor/tristim/internals/tristimcalculator.h"
+#include "aldermoor/tristim/internals/vocabulary.h"
 #include "aldermoor/tristim/tristimservice.h"
 #include "aldermoor/vexdoc/colorimetrybridge.h"
 
@@ -16,6 +17,7 @@ using Vexdoc::Conditions;
 using Vexdoc::Spectrum;
 
 std::string ColorFamily(const Spectrum& spectrum) try {
+  CheckViewing(*spectrum.GetConditions());
   const auto reason = [&] {
     return ReasonOfFailure(*spectrum.GetConditions(), "the colour family");
   };
@@ -35,6 +37,10 @@ ALDERMOOR_FRAME(Aldermoor::Measure::ColorFamily)
 
 float MetamerismIndex(const Spectrum& first, const Spectrum& second, const Conditions& conditions,
                       const Conditions& testConditions) try {
+  CheckViewing(conditions);
+  CheckWords(testConditions, {Tristim::Vocabulary::kIlluminationKey});
+  CheckKind(first);
+  CheckKind(second);
   const Tristim::HXMeasureConditions test = Vexdoc::ToMeasureConditions(testConditions);
   // Of the test light its name alone is looked at, so that a curve would be lost.
   if (test.GetIllumination().GetIlluminationType() == Tristim::IlluminationType::kUserdefined) {
@@ -52,6 +58,7 @@ float MetamerismIndex(const Spectrum& first, const Spectrum& second, const Condi
 ALDERMOOR_FRAME(Aldermoor::Measure::MetamerismIndex)
 
 Spectrum SpectrumOfColor(const ColorVector& color) try {
+  CheckColor(color);
   return Computed(
       [&] {
         return Vexdoc::ToSpectrum(TristimService::GetSpectrum(Vexdoc::ToHXColorVector(color)));

@@ -28,6 +28,9 @@ ALDERMOOR_EXPORT float MetamerismIndex(const Vexdoc::Spectrum& first,
 
 /// A reflectance spectrum of 36 values from 0 to 1 for a colour that can be taken to CIELab; its
 /// CIELab under the conditions of the colour differs from it by less than 0.1.
+///
+/// It is one of the many with that colour, not that of any real surface: jagged, since a search
+/// moves one band after the other away from a grey of 0.5, and a match under these conditions only.
 /// Throws: MeasureException for a colour that no such spectrum has.
 ALDERMOOR_EXPORT Vexdoc::Spectrum SpectrumOfColor(const Vexdoc::ColorVector& color);
 

@@ -1,6 +1,8 @@
 #include "aldermoor/measure/printcontrol.h"
 
+#include <cmath>
 #include <cstddef>
+#include <string>
 
 #include "aldermoor/measure/densitysupport.h"
 
@@ -14,6 +16,11 @@ using Vexdoc::ToHXSpectrum;
 
 float DotArea(const Spectrum& solid, const Spectrum& tint, DensityMode mode,
               DensityStandard standard, float yule_nielsen) try {
+  if (!(yule_nielsen > 0.0F) || !std::isfinite(yule_nielsen)) {
+    throw MeasureException("the Yule-Nielsen factor is " + std::to_string(yule_nielsen) +
+                               " and has to be a number above 0",
+                           ALDERMOOR_HERE(Aldermoor::Measure::DotArea));
+  }
   float result = 0.0F;
   Require([&] {
     return DensityCalculator::GetDotArea(ToHXSpectrum(solid), ToHXSpectrum(tint),
@@ -25,6 +32,8 @@ ALDERMOOR_FRAME(Aldermoor::Measure::DotArea)
 
 float PrintContrast(const Spectrum& solid, const Spectrum& tint, DensityMode mode,
                     const DensityOptions& options) try {
+  CheckFilter(solid);
+  CheckFilter(tint);
   float result = 0.0F;
   Require([&] {
     return DensityCalculator::GetContrast(ToHXSpectrum(solid), ToHXSpectrum(tint),
@@ -48,6 +57,7 @@ float Trapping(const Spectrum& first, const Spectrum& second, const Spectrum& ov
 ALDERMOOR_FRAME(Aldermoor::Measure::Trapping)
 
 float Greyness(const Spectrum& spectrum, const DensityOptions& options) try {
+  CheckFilter(spectrum);
   float result = 0.0F;
   Require([&] {
     return DensityCalculator::GetGreyness(ToHXSpectrum(spectrum), NumberOf(options.standard),
@@ -58,6 +68,7 @@ float Greyness(const Spectrum& spectrum, const DensityOptions& options) try {
 ALDERMOOR_FRAME(Aldermoor::Measure::Greyness)
 
 float HueError(const Spectrum& spectrum, const DensityOptions& options) try {
+  CheckFilter(spectrum);
   float result = 0.0F;
   Require([&] {
     return DensityCalculator::GetHueError(ToHXSpectrum(spectrum), NumberOf(options.standard),

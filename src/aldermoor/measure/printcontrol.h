@@ -9,11 +9,14 @@
 
 /// Print control from reflectance spectra of 36 values.  Results are fractions, 1 = 100 %, where
 /// nothing else is said.
-/// Throws: MeasureException for another length, and without a paper white where one is needed.
+/// Throws: MeasureException for another length, without a paper white where one is needed, for a
+/// value that its enumeration does not have, and, where the calibration is put on, for an unknown
+/// word under "Physical.Filter".
 namespace Aldermoor::Measure {
 
 /// Dot area by Murray and Davies, with a Yule-Nielsen factor other than 1 by Yule and Nielsen.
 /// Needs a paper white; uncalibrated.  0 for a solid of next to no density.
+/// Throws: MeasureException also for a factor that is not above 0 or not finite.
 /// Source: ISO 12647-1.
 ALDERMOOR_EXPORT float DotArea(const Vexdoc::Spectrum& solid, const Vexdoc::Spectrum& tint,
                                DensityMode mode, DensityStandard standard,

@@ -1,15 +1,33 @@
 #ifndef ALDERMOOR_MEASURE_SUPPORT_H
 #define ALDERMOOR_MEASURE_SUPPORT_H
 
+#include <initializer_list>
 #include <string>
+#include <string_view>
 
 #include "aldermoor/measure/measureexception.h"
 #include "aldermoor/tristim/tristimexception.h"
 #include "aldermoor/utilities/exceptions/frame.h"
+#include "aldermoor/vexdoc/colorvector.h"
 #include "aldermoor/vexdoc/conditions.h"
+#include "aldermoor/vexdoc/spectrum.h"
 
 /// What the functions of this folder share; not installed.
 namespace Aldermoor::Measure {
+
+/// Throws: MeasureException if one of `keys` has a word in `conditions` that colorimetry does not
+/// know, and for which it would put its default.
+void CheckWords(const Vexdoc::Conditions& conditions, std::initializer_list<std::string_view> keys);
+
+/// The same for illumination, observer and white base, and for an illumination "Userdefined"
+/// without a curve of 36 values.
+void CheckViewing(const Vexdoc::Conditions& conditions);
+
+/// The same for what decides how `spectrum` is read: whether it is an emission.
+void CheckKind(const Vexdoc::Spectrum& spectrum);
+
+/// The same for all that a colour refers to, with its colour space.
+void CheckColor(const Vexdoc::ColorVector& color);
 
 /// Why a colour under `conditions` cannot be computed.
 std::string ReasonOfFailure(const Vexdoc::Conditions& conditions, const std::string& what);

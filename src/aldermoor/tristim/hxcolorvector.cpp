@@ -16,7 +16,7 @@ ALDERMOOR_FRAME(Aldermoor::Tristim::HXColorVector::HXColorVector)
 
 HXColorVector::HXColorVector(float first, float second, float third,
                              const HXMeasureConditions& conditions) try
-    : values_{first, second, third, 0.0F}, conditions_(conditions) {}
+    : conditions_(conditions), values_{first, second, third, 0.0F} {}
 ALDERMOOR_FRAME(Aldermoor::Tristim::HXColorVector::HXColorVector)
 
 bool HXColorVector::operator==(const HXColorVector& other) const try {

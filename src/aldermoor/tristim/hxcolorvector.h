@@ -47,8 +47,8 @@ class HXColorVector {
                             const HXMeasureConditions& conditions);
 
  private:
+  HXMeasureConditions conditions_;  // first: a copy of it may fail, and then the values stay too
   Channels values_{};
-  HXMeasureConditions conditions_;
 };
 
 }  // namespace Aldermoor::Tristim

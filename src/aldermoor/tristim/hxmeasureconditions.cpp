@@ -92,7 +92,12 @@ HXMeasureConditions::HXMeasureConditions() try
 ALDERMOOR_FRAME(Aldermoor::Tristim::HXMeasureConditions::HXMeasureConditions)
 
 HXMeasureConditions::HXMeasureConditions(const HXMeasureConditions& other) = default;
-HXMeasureConditions& HXMeasureConditions::operator=(const HXMeasureConditions& other) = default;
+HXMeasureConditions& HXMeasureConditions::operator=(const HXMeasureConditions& other) try {
+  // The copy may fail half-way, the move cannot.
+  return *this = HXMeasureConditions(other);
+}
+ALDERMOOR_FRAME(Aldermoor::Tristim::HXMeasureConditions::operator=)
+HXMeasureConditions& HXMeasureConditions::operator=(HXMeasureConditions&& other) noexcept = default;
 HXMeasureConditions::~HXMeasureConditions() = default;
 
 bool HXMeasureConditions::operator==(const HXMeasureConditions& other) const try {
@@ -182,7 +187,7 @@ ALDERMOOR_FRAME(Aldermoor::Tristim::HXMeasureConditions::GetUserdefinedIlluminat
 void HXMeasureConditions::SetUserdefinedIllumination(const HXSpectrum& spectrum) try {
   userdefined_illumination_ =
       Utilities::Tools::SmartPointer<HXSpectrum>(std::make_unique<HXSpectrum>(spectrum).release());
-  SetMeasureCondition(Words::kIlluminationKey, Words::kUserdefined);
+  illumination_ = HXIllumination(IlluminationType::kUserdefined);
 }
 ALDERMOOR_FRAME(Aldermoor::Tristim::HXMeasureConditions::SetUserdefinedIllumination)
 

@@ -73,7 +73,9 @@ class HXMeasureConditions : public Internals::GlobalStringInitialisator {
 
   HXMeasureConditions();
   HXMeasureConditions(const HXMeasureConditions& other);
+  /// Nothing has changed if memory runs out.
   HXMeasureConditions& operator=(const HXMeasureConditions& other);
+  HXMeasureConditions& operator=(HXMeasureConditions&& other) noexcept;
   virtual ~HXMeasureConditions();
 
   /// Custom conditions take no part.  Curves are equal if they are one object, or as spectra.

@@ -55,7 +55,7 @@ class HXSpectrum {
   unsigned short GetWaveLength(unsigned short index) const;
 
  private:
-  HXMeasureConditions conditions_;
+  HXMeasureConditions conditions_;  // first: a copy of it may fail, and then the values stay too
   Bands values_{};
 };
 

@@ -243,6 +243,10 @@ Weighting::Weighting(const HXMeasureConditions& conditions) {
 
 namespace {
 
+bool IsEmission(const HXMeasureConditions& conditions) {
+  return conditions.GetIllumination().GetIlluminationType() == IlluminationType::kEmission;
+}
+
 HXMeasureConditions AsSeen(const HXMeasureConditions& conditions, bool is_emission) {
   HXMeasureConditions seen = conditions;
   if (is_emission) {
@@ -258,6 +262,7 @@ Viewing::Viewing(const HXMeasureConditions& conditions, bool is_emission,
     : weighting(AsSeen(conditions, is_emission)) {
   const bool is_relative = !is_emission && conditions.GetWhiteBase() == WhiteBase::Paper;
   lacks_paper = is_relative && !paper_white;
+  black_is_relative = is_relative && !IsEmission(conditions);
   if (is_relative) {
     paper = paper_white;
   }
@@ -267,7 +272,8 @@ Triple Viewing::GetAlmostBlack() const {
   HXSpectrum::Bands values;
   values.fill(kAlmostBlack);
   Triple xyz;
-  XyzFromSpectra(weighting.GetWeights(), GetPaper(), {values.data(), 0}, 1, xyz.data());
+  XyzFromSpectra(weighting.GetWeights(), black_is_relative ? GetPaper() : nullptr,
+                 {values.data(), 0}, 1, xyz.data());
   return xyz;
 }
 

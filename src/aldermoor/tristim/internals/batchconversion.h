@@ -43,6 +43,9 @@ struct Viewing {
   Weighting weighting;
   std::optional<HXSpectrum::Bands> paper;  ///< by which spectra are divided
   bool lacks_paper;                        ///< relative to a paper that is not there
+  /// Whether the almost black is divided by the paper: it stands under the conditions of the
+  /// colour, so that it shines by itself where these say so, even if the spectra do not.
+  bool black_is_relative;
 };
 
 /// What the second step of a conversion from spectra needs.

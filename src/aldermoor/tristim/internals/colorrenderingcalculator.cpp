@@ -172,10 +172,16 @@ double SumOfIndices(const HXSpectrum& source, const UvY& source_uvy, const HXSpe
 
 double ColorRenderingCalculator::GetColorRenderingIndex(const HXSpectrum& source, bool& valid,
                                                         std::string& reference) const try {
+  return GetColorRenderingIndex(source, ColorTemperature().GetColorTemperature(source), valid,
+                                reference);
+}
+ALDERMOOR_FRAME(Aldermoor::Tristim::Internals::ColorRenderingCalculator::GetColorRenderingIndex)
+
+double ColorRenderingCalculator::GetColorRenderingIndex(const HXSpectrum& source, float kelvin,
+                                                        bool& valid, std::string& reference) const
+    try {
   valid = false;
   reference.clear();
-  const ColorTemperature temperature;
-  const float kelvin = temperature.GetColorTemperature(source);
   if (kelvin <= 0.0F) {
     return 0.0;
   }
@@ -183,7 +189,7 @@ double ColorRenderingCalculator::GetColorRenderingIndex(const HXSpectrum& source
   std::string name;
   const std::optional<HXSpectrum> light =
       kelvin < kFirstDaylight
-          ? temperature.GetPlanckRadiator(kelvin, BaseConditions())
+          ? ColorTemperature().GetPlanckRadiator(kelvin, BaseConditions())
           : NearestDaylight(source_uvy, static_cast<std::size_t>(daylights_), name);
   if (!light) {
     return 0.0;

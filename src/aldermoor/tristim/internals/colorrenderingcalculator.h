@@ -22,6 +22,9 @@ class ColorRenderingCalculator {
   /// a reference the index is 0, not valid, the name empty.
   double GetColorRenderingIndex(const HXSpectrum& source, bool& valid,
                                 std::string& reference) const;
+  /// The same for a source whose colour temperature is `kelvin`; 0 or below for none.
+  double GetColorRenderingIndex(const HXSpectrum& source, float kelvin, bool& valid,
+                                std::string& reference) const;
 
  private:
   double tolerance_ = 0.0054;

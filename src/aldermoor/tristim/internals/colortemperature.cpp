@@ -1,8 +1,10 @@
 #include "aldermoor/tristim/internals/colortemperature.h"
 
+#include <algorithm>
 #include <array>
 #include <cmath>
 #include <cstddef>
+#include <optional>
 
 #include "aldermoor/tristim/internals/colormath.h"
 #include "aldermoor/tristim/internals/tristimcalculator.h"
@@ -80,6 +82,29 @@ class Locus {
     weights_ = {filter[0], filter[1], filter[2]};
   }
 
+  /// Whether `sample` is, to the last bit, the point of the locus.
+  [[nodiscard]] bool IsAt(float temperature, const Uv& sample) const {
+    return At(temperature) == sample;
+  }
+
+  /// Whether `temperature` is that of the nearest point, as far as some others tell.  Where the
+  /// locus bends away or hardly moves, a right angle may be found at another place.
+  [[nodiscard]] bool IsNearestAt(float temperature, const Uv& sample) const {
+    constexpr float kOthers[] = {500.0F,  1000.0F, 1500.0F,  2000.0F,  3000.0F,
+                                 5000.0F, 8000.0F, 20000.0F, 100000.0F};
+    constexpr float kNextTo = 0.01F;  // of the temperature: differs by rounding alone
+    constexpr float kNearer = 0.99F;  // of the squared distance: more than single precision errs
+    const auto distance = [&](float kelvin) {
+      const Uv to_sample = Difference(sample, At(kelvin));
+      return Dot(to_sample, to_sample);
+    };
+    const float least = distance(temperature);
+    return std::ranges::none_of(kOthers, [&](float other) {
+      return std::abs(other - temperature) > kNextTo * temperature &&
+             distance(other) < kNearer * least;
+    });
+  }
+
   [[nodiscard]] bool GetCosine(float temperature, const Uv& sample, double& cosine) const {
     const Uv to_sample = Difference(sample, At(temperature));
     const float distance = Dot(to_sample, to_sample);
@@ -106,6 +131,23 @@ class Locus {
 
   AxisWeights weights_;
 };
+
+/// The chromaticity of a light under its own conditions.
+std::optional<Uv> UvOf(const HXSpectrum& spectrum) {
+  HXMeasureConditions as_xyz = spectrum.GetMeasureConditions();
+  as_xyz.SetMeasureCondition(Words::kColorSpaceKey, Words::kCIEXYZ);
+  HXColorVector xyz;
+  HXColorVector uvy;
+  if (!TristimCalculator::GetVector_CIEXYZ(spectrum, as_xyz, xyz) ||
+      !TristimCalculator::GetVector_CIEuvY1960(xyz, uvy)) {
+    return std::nullopt;
+  }
+  return Uv{uvy[0], uvy[1]};
+}
+
+float Rounded(float kelvin) {
+  return std::floor(kelvin + 0.5F);
+}
 
 // 0 counts as positive.
 bool IsNegative(double cosine) {
@@ -145,15 +187,29 @@ bool ColorTemperature::GetPlanckianCosine(float temperature, const HXColorVector
 ALDERMOOR_FRAME(Aldermoor::Tristim::Internals::ColorTemperature::GetPlanckianCosine)
 
 float ColorTemperature::GetColorTemperature(const HXSpectrum& spectrum) const try {
-  HXMeasureConditions as_xyz = spectrum.GetMeasureConditions();
-  as_xyz.SetMeasureCondition(Words::kColorSpaceKey, Words::kCIEXYZ);
-  HXColorVector xyz;
-  HXColorVector uvy;
-  if (!TristimCalculator::GetVector_CIEXYZ(spectrum, as_xyz, xyz) ||
-      !TristimCalculator::GetVector_CIEuvY1960(xyz, uvy)) {
-    return kNoTemperature;
+  return Search(spectrum).temperature;
+}
+ALDERMOOR_FRAME(Aldermoor::Tristim::Internals::ColorTemperature::GetColorTemperature)
+
+float ColorTemperature::FindColorTemperature(const HXSpectrum& spectrum) const try {
+  const Found found = Search(spectrum);
+  const float kelvin = found.temperature > 0.0F ? found.temperature : found.on_locus;
+  const std::optional<Uv> sample = UvOf(spectrum);
+  const bool is_good = kelvin > 0.0F && sample &&
+                       Locus(spectrum.GetMeasureConditions()).IsNearestAt(kelvin, *sample);
+  return is_good ? kelvin : kNoTemperature;
+}
+ALDERMOOR_FRAME(Aldermoor::Tristim::Internals::ColorTemperature::FindColorTemperature)
+
+ColorTemperature::Found ColorTemperature::Search(const HXSpectrum& spectrum) const {
+  const auto none = [](float on_locus = kNoTemperature) {
+    return Found{kNoTemperature, on_locus};
+  };
+  const std::optional<Uv> uv = UvOf(spectrum);
+  if (!uv) {
+    return none();
   }
-  const Uv sample = {uvy[0], uvy[1]};
+  const Uv sample = *uv;
   const Locus locus(spectrum.GetMeasureConditions());
   float high = maximum_ - kTangentHalf;
   float low = minimum_ + kTangentHalf;
@@ -161,13 +217,13 @@ float ColorTemperature::GetColorTemperature(const HXSpectrum& spectrum) const tr
   double at_low = 0.0;
   if (!locus.GetCosine(high, sample, at_high) || !locus.GetCosine(low, sample, at_low) ||
       IsNegative(at_high) == IsNegative(at_low)) {
-    return kNoTemperature;
+    return none(locus.IsAt(high, sample) ? high : kNoTemperature);
   }
   while (std::abs(high - low) > tolerance_) {
     const float middle = (high + low) / 2.0F;
     double at_middle = 0.0;
     if (!locus.GetCosine(middle, sample, at_middle)) {
-      return kNoTemperature;
+      return none(locus.IsAt(middle, sample) ? Rounded(middle) : kNoTemperature);
     }
     if (IsNegative(at_middle) != IsNegative(at_high)) {
       low = middle;
@@ -176,8 +232,7 @@ float ColorTemperature::GetColorTemperature(const HXSpectrum& spectrum) const tr
       at_high = at_middle;
     }
   }
-  return std::floor((high + low) / 2.0F + 0.5F);
+  return {Rounded((high + low) / 2.0F), kNoTemperature};
 }
-ALDERMOOR_FRAME(Aldermoor::Tristim::Internals::ColorTemperature::GetColorTemperature)
 
 }  // namespace Aldermoor::Tristim::Internals

@@ -18,6 +18,10 @@ class ColorTemperature {
   /// In whole kelvin; -1 if the light is not between the ends of the search, stands exactly on the
   /// locus, or has no chromaticity.  Black has that of equal energy, and so about 5456 K.
   [[nodiscard]] float GetColorTemperature(const HXSpectrum& spectrum) const;
+  /// The same, but a light on which the search comes to stand exactly has the temperature of that
+  /// point of the locus in place of -1, and one for which it ended far from the nearest point -1:
+  /// a black body of 985 K would have 500,108 K.
+  [[nodiscard]] float FindColorTemperature(const HXSpectrum& spectrum) const;
 
   /// Spectral radiance in W per m3 and sr; `temperature` in kelvin.
   HXSpectrum GetPlanckRadiator(float temperature, const HXMeasureConditions& conditions) const;
@@ -31,6 +35,12 @@ class ColorTemperature {
                                         double& cosine) const;
 
  private:
+  struct Found {
+    float temperature;  // -1 for none
+    float on_locus;     // of the point where the search ended since the light stands on it, or -1
+  };
+  Found Search(const HXSpectrum& spectrum) const;
+
   float minimum_ = 200.0F;      // kelvin
   float maximum_ = 1000000.0F;  // kelvin
   float tolerance_ = 0.5F;      // kelvin

@@ -96,22 +96,18 @@ TristimFilter& TristimFilter::Get() {
 }
 
 void TristimFilter::SetMeasuringConditions(const HXMeasureConditions& conditions) try {
-  const auto build = [&conditions] {
-    return SmartPointer<Weightfactors>(std::make_unique<Weightfactors>(conditions).release());
-  };
-  if (!weightfactors_ || !conditions_) {
-    auto weightfactors = build();
-    conditions_ = SmartPointer<HXMeasureConditions>(
-        std::make_unique<HXMeasureConditions>(conditions).release());
-    weightfactors_ = std::move(weightfactors);
+  if (weightfactors_ && conditions_->GetIllumination() == conditions.GetIllumination() &&
+      conditions_->GetObserver() == conditions.GetObserver() &&
+      conditions_->SharesUserdefinedIllumination(conditions)) {
     return;
   }
-  if (conditions_->GetIllumination() != conditions.GetIllumination() ||
-      conditions_->GetObserver() != conditions.GetObserver() ||
-      !conditions_->SharesUserdefinedIllumination(conditions)) {
-    weightfactors_ = build();
-  }
-  *conditions_ = conditions;
+  // Both are made before either is kept: weights beside the conditions of others would be taken
+  // for theirs the next time.
+  SmartPointer<Weightfactors> weightfactors(std::make_unique<Weightfactors>(conditions).release());
+  SmartPointer<HXMeasureConditions> kept(
+      std::make_unique<HXMeasureConditions>(conditions).release());
+  weightfactors_ = std::move(weightfactors);
+  conditions_ = std::move(kept);
 }
 ALDERMOOR_FRAME(Aldermoor::Tristim::Internals::TristimFilter::SetMeasuringConditions)
 

@@ -20,7 +20,8 @@ class TristimFilter {
 
   /// Builds the weights, unless illumination, observer and user-defined curve (the object, not its
   /// values) are those of the last time.
-  /// Throws: what building the weights throws; the old ones then stay.
+  /// Throws: what building the weights throws, std::bad_alloc; the old ones then stay, with the
+  /// conditions that are theirs.
   void SetMeasuringConditions(const HXMeasureConditions& conditions);
 
   /// White point: X, 100, Z for axis 0, 1, 2.  0 for other axes, and before the first conditions.
@@ -39,7 +40,7 @@ class TristimFilter {
 
  private:
   Utilities::Tools::SmartPointer<Weightfactors> weightfactors_;
-  Utilities::Tools::SmartPointer<HXMeasureConditions> conditions_;
+  Utilities::Tools::SmartPointer<HXMeasureConditions> conditions_;  // of the weights
 };
 
 }  // namespace Aldermoor::Tristim::Internals
