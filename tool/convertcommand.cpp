@@ -126,7 +126,7 @@ class ConvertCommand : public Command {
                          output_ == kStandardStream ? "<standard output>" : output_));
       return ExitStatus::kSomeFailed;
     }
-    Output output(output_, Output::Content::kDocument);
+    Output output(output_, FileForm::kCsv);
     output.Write(csv.text);
     output.Commit();
     return csv.faults > 0 ? ExitStatus::kSomeFailed : ExitStatus::kDone;

@@ -71,12 +71,15 @@ std::string CheckedText(const Vexdoc::VEX& document, const std::string& shown, b
   return out.str();
 }
 
-// Not beside a device, nor in a folder that takes no more files; the XML file is saved all the
-// same.
+// Not beside a device, nor over a document that was read, nor in a folder that takes no more files;
+// the XML file is saved all the same.
 bool HasPlaceForCache(const std::string& path) {
   namespace fs = std::filesystem;
   const fs::path file = path;
   if (fs::exists(file) && !fs::is_regular_file(file)) {
+    return false;
+  }
+  if (const auto input = InputThatIs(CachePath(path)); input && input->form != FileForm::kOther) {
     return false;
   }
   const fs::path folder = file.has_parent_path() ? file.parent_path() : ".";
@@ -129,14 +132,14 @@ ExitStatus SaveChecked(const Vexdoc::VEX& document, const std::string& path, boo
     return ExitStatus::kSomeFailed;
   }
   if (standard) {
-    Output output(path, Output::Content::kDocument);
+    Output output(path, FileForm::kXml);
     output.Write(text);
     output.Commit();
     return ExitStatus::kDone;
   }
   try {
     Utilities::FileSystem::File file(path);
-    ReportReplacedInput(path);
+    ReplaceInput(path, FileForm::kXml);
     document.SaveXML(file, cache && HasPlaceForCache(path));
     return ExitStatus::kDone;
   } catch (const Utilities::Exceptions::ResourceException& e) {
