@@ -252,21 +252,28 @@ void XMLChecker::CheckSpectrum(const NodeHolder& spectrum, Block* block) {
 void XMLChecker::CheckColor(const NodeHolder& color, const Block* block) {
   CheckContainer(color, kConditions);
   CheckHeader(color, false, {kValue});
-  std::size_t channels = 0;
-  ForEachElement(color, kValue, [this, &channels](const NodeHolder& value) {
+  std::vector<std::string> labels;
+  ForEachElement(color, kValue, [this, &labels](const NodeHolder& value) {
     const DOMNode* const attribute = value.FirstAttribute();
     if (attribute == nullptr || !XMLString::equals(attribute->getNodeName(), kName)) {
       return WarnOfLoss(value, "'Value' is not read: its first attribute is not 'Name'");
     }
-    ++channels;
+    labels.push_back(ToNativeString(attribute->getNodeValue()));
     CheckNumber(value, true);
   });
   if (block == nullptr) {
     return;
   }
-  for (const std::string& fault : is_legacy_ ? LegacyColorFaults(block->conditions, channels)
-                                             : ColorFaults(block->conditions, channels)) {
+  const auto faults = is_legacy_ ? LegacyColorFaults(block->conditions, labels.size())
+                                 : ColorFaults(block->conditions, labels.size());
+  for (const std::string& fault : faults) {
     Error(color, fault);
+  }
+  if (const std::string fault = LabelFault(block->conditions, labels);
+      faults.empty() && !fault.empty()) {
+    // The legacy dialect forgets the labels, so that nothing shows what they were.
+    Add(Fault::Severity::kWarning, color, fault,
+        is_legacy_ ? Fault::Loss::kContent : Fault::Loss::kLabels);
   }
 }
 
