@@ -14,11 +14,11 @@
 #include "aldermoor/vexdoc/inspection.h"
 #include "aldermoor/vexdoc/vexexception.h"
 
+#include "completion.h"
 #include "diagnostics.h"
 #include "documentdiff.h"
 #include "documents.h"
 #include "inputfile.h"
-#include "options.h"
 #include "output.h"
 
 namespace Aldermoor::Tool {
@@ -65,6 +65,12 @@ std::string CheckedText(const Vexdoc::VEX& document, const std::string& shown, b
     Report(fmt::format("{}: XML cannot carry the document; nothing is written", shown));
     return "";
   }
+  // A load takes spectra without them, but what they are then nobody can tell.
+  if (!ReportMissing(Vexdoc::CompleteConditions(again, {}),
+                     "'aldermoor convert' with --condition")) {
+    Report(fmt::format("{}: conditions are missing; nothing is written", shown));
+    return "";
+  }
   if (const std::string digits = diff.DigitsText(); tell_digits && !digits.empty()) {
     Report(digits);
   }
@@ -95,32 +101,16 @@ void ForgetDates(Header& element) {
   element.RemoveAttribute(Header::kModifiedKey);
 }
 
-Vexdoc::LoadReport LoadStored(const std::string& path, Vexdoc::VEX& document,
-                              const Vexdoc::LoadOptions& options) {
-  return LoadStored(path, ReadBytes(path), document, options);
+void LoadStored(const std::string& path, Vexdoc::VEX& document) {
+  std::istringstream in(ReadBytes(path));
+  TryLoad(path, [&] { return document.Load(in, Vexdoc::LoadOptions()); });
 }
 
 Vexdoc::LoadReport LoadStored(const std::string& path, const std::string& text,
                               Vexdoc::VEX& document, const Vexdoc::LoadOptions& options) {
   std::istringstream in(text);
-  return TryLoad(path, [&] { return document.Load(in, options); });
-}
-
-void CompleteOption::AddTo(CLI::App& app) {
-  AddFlag(app, "--complete", is_set,
-          "Where the wavelengths of a spectrum are not those of its conditions, take minimum, "
-          "maximum and number from its points, if they have one step");
-}
-
-Vexdoc::WavelengthUse CompleteOption::GetUse() const {
-  return is_set ? Vexdoc::WavelengthUse::kComplete : Vexdoc::WavelengthUse::kRefuse;
-}
-
-void ReportRanges(const std::string& path, const Vexdoc::LoadReport& report) {
-  for (const auto& [range, spectra] : report.ranges_taken) {
-    Report(fmt::format("{}: the range {} taken from the points of {} {}", ShownPath(path), range,
-                       spectra, spectra == 1 ? "spectrum" : "spectra"));
-  }
+  return TryLoad(
+      path, [&] { return document.Load(in, options); }, "--complete");
 }
 
 ExitStatus SaveChecked(const Vexdoc::VEX& document, const std::string& path, bool cache,

@@ -43,7 +43,7 @@ std::string RangeText(const Wavelengths& points) {
          std::to_string(points.back()) + "nm";
 }
 
-[[noreturn]] void Refuse(const LoadReport& report) {
+[[noreturn]] void Refuse(const LoadReport& report, bool can_complete) {
   constexpr std::size_t kMostInText = 3;
   std::string text = "the wavelengths are not those of the conditions";
   for (std::size_t i = 0; i < std::min(kMostInText, report.contradictions.size()); ++i) {
@@ -52,7 +52,8 @@ std::string RangeText(const Wavelengths& points) {
   if (report.contradiction_count > kMostInText) {
     text += "\nand " + std::to_string(report.contradiction_count - kMostInText) + " more";
   }
-  throw WavelengthException(text, ALDERMOOR_HERE(Aldermoor::Vexdoc::Internals::LoadNotes::Settle));
+  throw WavelengthException(text, ALDERMOOR_HERE(Aldermoor::Vexdoc::Internals::LoadNotes::Settle),
+                            can_complete);
 }
 
 }  // namespace
@@ -110,9 +111,9 @@ void LoadNotes::Settle(VEX& document, const LoadOptions& options, LoadReport& re
   report.contradictions.assign(illuminations_.begin(),
                                illuminations_.begin() + static_cast<std::ptrdiff_t>(listed));
   report.contradiction_count = illuminations_.size();
-  FindContradictions(document, options, report);
+  const bool can_complete = FindContradictions(document, options, report) && illuminations_.empty();
   if (report.contradiction_count > 0 && options.wavelengths != WavelengthUse::kReport) {
-    Refuse(report);
+    Refuse(report, can_complete);
   }
 }
 
@@ -133,8 +134,9 @@ void LoadNotes::TakeRanges(const VEX& document, LoadReport& report) const {
   });
 }
 
-void LoadNotes::FindContradictions(const VEX& document, const LoadOptions& options,
+bool LoadNotes::FindContradictions(const VEX& document, const LoadOptions& options,
                                    LoadReport& report) const {
+  bool can_complete = options.wavelengths != WavelengthUse::kComplete;
   Agreement agreement;
   ForEachSpectrum(document, [&](const SampleSet& set, const Sample& sample,
                                 const SampleAttribute& spectrum, const Wavelengths& points) {
@@ -142,6 +144,7 @@ void LoadNotes::FindContradictions(const VEX& document, const LoadOptions& optio
     if (agreement.Of(points, conditions) || (options.completion && !NamesRange(conditions))) {
       return;
     }
+    can_complete = can_complete && AreRegular(points);
     if (++report.contradiction_count <= LoadReport::kMostListed) {
       report.contradictions.push_back(
           {set.GetName(), sample.GetName(),
@@ -151,6 +154,7 @@ void LoadNotes::FindContradictions(const VEX& document, const LoadOptions& optio
                     : "")});
     }
   });
+  return can_complete;
 }
 
 }  // namespace Aldermoor::Vexdoc::Internals
