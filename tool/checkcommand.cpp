@@ -38,7 +38,7 @@ struct Findings {
     is_cache = file.ends_with(".vexb") || bytes.starts_with(kCacheHead);
     std::istringstream in(std::move(bytes));
     faults = is_cache ? Vexdoc::CheckCache(in) : Vexdoc::CheckXML(in);
-    if (!is_cache && file != kStandardStream) {
+    if (!is_cache && file != kStandardStream && !IgnoresCaches()) {
       cache = Vexdoc::StateOfCache(Utilities::FileSystem::File(file));
     }
     for (const Fault& fault : faults) {

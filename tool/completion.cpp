@@ -37,17 +37,21 @@ void ReportGiven(const Texts& given, const Counts& taken, const Kind& kind) {
 
 }  // namespace
 
-bool ReportCompletion(const Vexdoc::CompletionReport& report, const KindConditions& given) {
+bool ReportMissing(const Vexdoc::CompletionReport& report, const std::string& remedy) {
   for (const auto& missing : report.missing) {
     Report(fmt::format(
-        "set '{}', sample '{}': the conditions of a {} lack {}; --condition KEY=VALUE gives them",
+        "set '{}', sample '{}': the conditions of a {} lack {}; {} KEY=VALUE gives them",
         missing.set, missing.sample, (missing.is_spectrum ? kSpectrum : kColor).one,
-        fmt::join(missing.keys, ", ")));
+        fmt::join(missing.keys, ", "), remedy));
   }
-  if (report.missing_count > 0) {
-    if (const std::size_t more = report.missing_count - report.missing.size(); more > 0) {
-      Report(fmt::format("and {} more like them", more));
-    }
+  if (const std::size_t more = report.missing_count - report.missing.size(); more > 0) {
+    Report(fmt::format("and {} more like them", more));
+  }
+  return report.missing_count == 0;
+}
+
+bool ReportCompletion(const Vexdoc::CompletionReport& report, const KindConditions& given) {
+  if (!ReportMissing(report, "--condition")) {
     return false;
   }
   for (const auto& [points, spectra] : report.counted) {

@@ -1,21 +1,17 @@
 #include <algorithm>
 #include <memory>
-#include <sstream>
 #include <string>
 
 #include <fmt/format.h>
 
-#include "aldermoor/vexdoc/inspection.h"
-
 #include "command.h"
-#include "completion.h"
 #include "csvdocument.h"
 #include "diagnostics.h"
-#include "faults.h"
 #include "inputfile.h"
 #include "options.h"
 #include "output.h"
 #include "vocabulary.h"
+#include "wholeinput.h"
 #include "xmldocument.h"
 
 namespace Aldermoor::Tool {
@@ -33,19 +29,6 @@ bool IsCsv(const std::string& path, const std::string& option, const std::string
   return end == ".csv";
 }
 
-// Tells what stands in XML and does not come into the document; returns whether there is any.
-bool ReportLosses(const std::string& path, const std::string& text) {
-  std::istringstream in(text);
-  bool has_losses = false;
-  for (const Vexdoc::Fault& fault : Vexdoc::CheckXML(in)) {
-    if (fault.loss == Vexdoc::Fault::Loss::kContent) {
-      has_losses = true;
-      Report(FaultText(path, fault));
-    }
-  }
-  return has_losses;
-}
-
 class ConvertCommand : public Command {
  public:
   void AddOptions(CLI::App& app) override {
@@ -56,8 +39,7 @@ class ConvertCommand : public Command {
     AddOption(app, "--to", to_, "WORD", "Form of OUT, likewise");
     AddFlag(app, "--no-cache", no_cache_, "Leave the cache beside an XML file as it is");
     csv_.conditions.AddTo(app);
-    complete_.AddTo(app);
-    AddFlag(app, "--strict", is_strict_, "Write nothing if something in an XML file is not read");
+    whole_.AddTo(app);
     AddOption(app, "--separator", separator_, "WORD",
               "Between the cells of CSV: comma semicolon tab");
     AddFlag(app, "--percent", csv_.percent, "The spectra of the CSV file are in percent");
@@ -79,39 +61,22 @@ class ConvertCommand : public Command {
         status = ExitStatus::kSomeFailed;
       }
     } else {
-      LoadWhole(document);
+      KindConditions given;
+      csv_.conditions.ApplyTo(given);
+      whole_.Load(input_, document, &given);
     }
     return Worse(status,
                  to_csv ? SaveCsv(document) : SaveChecked(document, output_, !no_cache_, true));
   }
 
  private:
-  // Completes the document, and tells what is lost on the way into it.
-  void LoadWhole(Vexdoc::VEX& document) const {
-    KindConditions given;
-    csv_.conditions.ApplyTo(given);
-    const std::string text = ReadBytes(input_);
-    Vexdoc::LoadOptions options;
-    options.wavelengths = complete_.GetUse();
-    options.completion = Vexdoc::Completion{given.spectrum, given.color};
-    const Vexdoc::LoadReport report = LoadStored(input_, text, document, options);
-    ReportRanges(input_, report);
-    if (!ReportCompletion(report.completion, given)) {
-      throw RefusedError(
-          fmt::format("{}: conditions are missing; nothing is written", ShownPath(input_)));
-    }
-    if (ReportLosses(input_, text) && is_strict_) {
-      throw RefusedError(fmt::format("{}: --strict; nothing is written", ShownPath(input_)));
-    }
-  }
-
   void CheckOptions(bool from_csv, bool to_csv) {
     CheckWord("--separator", separator_, {"comma", "semicolon", "tab"});
     csv_.separator = separator_ == "comma" ? ',' : separator_ == "tab" ? '\t' : ';';
     if (!from_csv && (csv_.percent || csv_.set)) {
       throw UsageError("--percent and --set are for a CSV file that is read");
     }
-    if (from_csv && (complete_.is_set || is_strict_)) {
+    if (from_csv && whole_.IsAskedFor()) {
       throw UsageError("--complete and --strict are for an XML file that is read");
     }
     if (!from_csv && !to_csv && csv_.skip_faulty) {
@@ -126,7 +91,7 @@ class ConvertCommand : public Command {
                          output_ == kStandardStream ? "<standard output>" : output_));
       return ExitStatus::kSomeFailed;
     }
-    Output output(output_, Output::Content::kDocument);
+    Output output(output_, FileForm::kCsv);
     output.Write(csv.text);
     output.Commit();
     return csv.faults > 0 ? ExitStatus::kSomeFailed : ExitStatus::kDone;
@@ -138,8 +103,7 @@ class ConvertCommand : public Command {
   std::string to_;
   std::string separator_ = "comma";
   bool no_cache_ = false;
-  CompleteOption complete_;
-  bool is_strict_ = false;
+  WholeInput whole_;
   CsvOptions csv_;
 };
 

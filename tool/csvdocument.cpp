@@ -73,7 +73,7 @@ class CsvImport {
       : path_(path),
         options_(options),
         document_(document),
-        text_(ReadBytes(path)),
+        text_(ReadBytes(path, FileForm::kCsv)),
         reader_(text_, options.separator, faults_) {}
 
   // Returns the number of rows that were left out.

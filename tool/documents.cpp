@@ -34,9 +34,9 @@ void CheckIsFile(const std::string& path) {
   }
 }
 
-bool& IgnoresCaches() {
-  static bool ignores = false;
-  return ignores;
+bool& NoCacheFlag() {
+  static bool is_set = false;
+  return is_set;
 }
 
 // Messages of the library may be of several lines, each one the reason of the line above.
@@ -54,16 +54,15 @@ std::string Reason(const std::exception& e) {
 
 }  // namespace
 
-Vexdoc::LoadReport TryLoad(const std::string& path,
-                           const std::function<Vexdoc::LoadReport()>& load) {
+Vexdoc::LoadReport TryLoad(const std::string& path, const std::function<Vexdoc::LoadReport()>& load,
+                           const std::string& completer) {
   const std::string shown = ShownPath(path);
   try {
     return load();
   } catch (const Vexdoc::WavelengthException& e) {
-    throw RefusedError(fmt::format(
-        "{}: {}; 'aldermoor convert --complete' takes the range from the points, if they have one "
-        "step",
-        shown, Reason(e)));
+    throw RefusedError(
+        fmt::format("{}: {}{}", shown, Reason(e),
+                    e.CanComplete() ? "; " + completer + " takes the range from the points" : ""));
   } catch (const Vexdoc::VexXMLParseException& e) {
     throw InputError(fmt::format("{}:{}:{}: {}", shown, e.GetLine(), e.GetColumn(), Reason(e)));
   } catch (const std::exception& e) {
@@ -93,7 +92,11 @@ Vexdoc::LoadReport LoadDocument(const std::string& path, Vexdoc::VEX& document,
 }
 
 void AddNoCacheFlag(CLI::App& app) {
-  AddFlag(app, "--no-cache", IgnoresCaches(), "Read XML files themselves, not their caches");
+  AddFlag(app, "--no-cache", NoCacheFlag(), "Read XML files themselves, not their caches");
+}
+
+bool IgnoresCaches() {
+  return NoCacheFlag();
 }
 
 void InputOptions::AddTo(CLI::App& app) {

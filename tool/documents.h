@@ -21,9 +21,10 @@ namespace Aldermoor::Tool {
 
 /// Calls `load`, which reads `path`, and turns what it throws into messages.
 /// Throws: InputError with the place of the fault in front, as far as it is known; RefusedError for
-/// spectra whose wavelengths are not those of their conditions.
-Vexdoc::LoadReport TryLoad(const std::string& path,
-                           const std::function<Vexdoc::LoadReport()>& load);
+/// spectra whose wavelengths are not those of their conditions, with `completer`, the name of what
+/// takes the range from the points, if that can be done.
+Vexdoc::LoadReport TryLoad(const std::string& path, const std::function<Vexdoc::LoadReport()>& load,
+                           const std::string& completer = "'aldermoor convert --complete'");
 
 /// Reads a document, from standard input for "-", and from the cache beside the file unless
 /// "--no-cache" was given, and notes it as an input.
@@ -34,6 +35,8 @@ Vexdoc::LoadReport LoadDocument(const std::string& path, Vexdoc::VEX& document,
 /// The option "--no-cache" of the commands that read with LoadDocument.  Shared state: what it says
 /// holds for the whole run of the program.
 void AddNoCacheFlag(CLI::App& app);
+/// Whether it was given.
+bool IgnoresCaches();
 
 /// The argument "FILE...".
 struct InputOptions {

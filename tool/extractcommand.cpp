@@ -10,6 +10,7 @@
 #include "inputfile.h"
 #include "options.h"
 #include "output.h"
+#include "wholeinput.h"
 #include "xmldocument.h"
 
 namespace Aldermoor::Tool {
@@ -35,7 +36,7 @@ class ExtractCommand : public Command {
     AddArgument(app, "FILE", input_, "Document to read; - is standard input");
     filter_.AddTo(app);
     AddRequiredOutputOption(app, output_);
-    complete_.AddTo(app);
+    whole_.AddTo(app);
     AddFlag(app, "--no-cache", no_cache_, "Leave the cache beside the file as it is");
   }
 
@@ -44,9 +45,7 @@ class ExtractCommand : public Command {
       throw UsageError("--set or --sample must say what to extract");
     }
     Vexdoc::VEX document;
-    Vexdoc::LoadOptions options;
-    options.wavelengths = complete_.GetUse();
-    ReportRanges(input_, LoadStored(input_, document, options));
+    whole_.Load(input_, document);
     KeepOnly(document, [this](Vexdoc::SampleSet& set) {
       if (!filter_.TakesSet(set.GetName())) {
         return false;
@@ -68,7 +67,7 @@ class ExtractCommand : public Command {
   std::string input_;
   std::string output_;
   SampleFilter filter_;
-  CompleteOption complete_;
+  WholeInput whole_;
   bool no_cache_ = false;
 };
 

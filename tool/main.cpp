@@ -83,7 +83,7 @@ constexpr CommandEntry kCommands[] = {
     {"check", "Tell everything that is wrong with documents and caches",
      "  aldermoor check chart.xml Cache/chart.vexb\n"
      "  aldermoor check --format json *.xml\n",
-     &MakeCheckCommand},
+     &MakeCheckCommand, true},
     {"dump", "Show the bytes of a cache with their meaning", "  aldermoor dump Cache/chart.vexb\n",
      &MakeDumpCommand},
 };

@@ -12,6 +12,7 @@
 #include "inputfile.h"
 #include "options.h"
 #include "output.h"
+#include "wholeinput.h"
 #include "xmldocument.h"
 
 namespace Aldermoor::Tool {
@@ -39,18 +40,18 @@ class MergeCommand : public Command {
   void AddOptions(CLI::App& app) override {
     inputs_.AddTo(app);
     AddRequiredOutputOption(app, output_);
-    complete_.AddTo(app);
+    whole_.AddTo(app);
     AddFlag(app, "--no-cache", no_cache_, "Leave the cache beside the file as it is");
   }
 
   ExitStatus Run() override {
     inputs_.CheckStandardInput();
     Vexdoc::VEX merged;
-    Load(inputs_.paths.front(), merged);
+    whole_.Load(inputs_.paths.front(), merged);
     const auto header = merged.GetAttributes();
     for (auto path = std::next(inputs_.paths.begin()); path != inputs_.paths.end(); ++path) {
       Vexdoc::VEX document;
-      Load(*path, document);
+      whole_.Load(*path, document);
       ReportLostHeader(*path, merged, document);
       for (const auto& [key, set] : document.GetSampleSets()) {
         const std::string name = set->GetName();
@@ -68,15 +69,9 @@ class MergeCommand : public Command {
   }
 
  private:
-  void Load(const std::string& path, Vexdoc::VEX& document) const {
-    Vexdoc::LoadOptions options;
-    options.wavelengths = complete_.GetUse();
-    ReportRanges(path, LoadStored(path, document, options));
-  }
-
   InputOptions inputs_;
   std::string output_;
-  CompleteOption complete_;
+  WholeInput whole_;
   bool no_cache_ = false;
 };
 

@@ -4,6 +4,7 @@
 #include <cstdio>
 #include <cstdlib>
 #include <filesystem>
+#include <optional>
 #include <system_error>
 
 #include <fcntl.h>
@@ -36,11 +37,19 @@ std::string EndOfLinks(std::filesystem::path path) {
   return path.string();
 }
 
+void CheckReplaces(const std::string& shown, FileForm form, const Input& input) {
+  if (form == FileForm::kOther || form != input.form) {
+    throw UsageError(fmt::format("{} would be written over the input {}; nothing is written", shown,
+                                 input.shown));
+  }
+}
+
 }  // namespace
 
-void ReportReplacedInput(const std::string& path) {
-  if (const std::string input = InputThatIs(path); !input.empty()) {
-    Report(fmt::format("{}: the input is replaced", input));
+void ReplaceInput(const std::string& path, FileForm form) {
+  if (const auto input = InputThatIs(path)) {
+    CheckReplaces(path, form, *input);
+    Report(fmt::format("{}: the input is replaced", input->shown));
   }
 }
 
@@ -49,7 +58,7 @@ OutputError::OutputError(const std::string& target, int error)
           fmt::format("{} cannot be written: {}", target, std::generic_category().message(error))),
       broken_pipe_(error == EPIPE) {}
 
-Output::Output(const std::string& path, Content content) : content_(content) {
+Output::Output(const std::string& path, FileForm form) : form_(form) {
   if (path == kStandardStream) {
     shown_ = "standard output";
     descriptor_ = STDOUT_FILENO;
@@ -65,15 +74,17 @@ Output::Output(const std::string& path, Content content) : content_(content) {
 }
 
 void Output::CheckInputs() const {
-  struct stat status {};
-  const int failed = target_.empty() ? fstat(descriptor_, &status) : stat(target_.c_str(), &status);
-  const std::string input = failed == 0 ? InputThatIs(status) : "";
-  // What goes to standard output would be mixed with what is there.
-  if (input.empty() || (content_ == Content::kDocument && !target_.empty())) {
+  if (!target_.empty()) {
+    if (const auto input = InputThatIs(target_)) {
+      CheckReplaces(shown_, form_, *input);
+    }
     return;
   }
-  throw UsageError(
-      fmt::format("{} would be written over the input {}; nothing is written", shown_, input));
+  struct stat status {};
+  const auto input = fstat(descriptor_, &status) == 0 ? InputThatIs(status) : std::nullopt;
+  if (input) {  // what goes to standard output would be mixed with what is there
+    CheckReplaces(shown_, FileForm::kOther, *input);
+  }
 }
 
 Output::~Output() {
@@ -153,10 +164,7 @@ void Output::Commit() {
     Fail(errno);
   }
   if (!temporary_.empty()) {
-    CheckInputs();
-    if (content_ == Content::kDocument) {
-      ReportReplacedInput(target_);
-    }
+    ReplaceInput(target_, form_);
     if (std::rename(temporary_.c_str(), target_.c_str()) != 0) {
       Fail(errno);
     }

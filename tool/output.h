@@ -5,6 +5,8 @@
 #include <string>
 #include <string_view>
 
+#include "inputfile.h"
+
 namespace Aldermoor::Tool {
 
 /// The name that stands for standard input or standard output.
@@ -21,22 +23,22 @@ class OutputError : public std::runtime_error {
   bool broken_pipe_;
 };
 
-/// Tells that the file `path`, which is about to be replaced by a document, is one that this run
-/// has read.
-void ReportReplacedInput(const std::string& path);
+/// To be called before a file takes the place of `path`: refuses to replace what this run reads,
+/// but for a document by one of the same form, which is told.
+/// Throws: UsageError.
+void ReplaceInput(const std::string& path, FileForm form);
 
 /// Where results go: standard output, or a file that is complete or not there at all.
 ///
 /// A file is written beside its target and takes its place in Commit; without it, whatever was
 /// there stays.  Devices and pipes are written directly.  A file that this run reads is refused,
-/// under whatever name, unless a document takes the place of its document: then that is told.
+/// under whatever name, and so are its cache and the document of a cache, unless a document takes
+/// the place of one of the same form: then that is told.
 /// Throws: OutputError; UsageError for a file that is read.
 class Output {
  public:
-  enum class Content { kResults, kDocument };
-
   /// Opens at once, so that a path that cannot be written fails before the work.
-  explicit Output(const std::string& path, Content content = Content::kResults);
+  explicit Output(const std::string& path, FileForm form = FileForm::kOther);
   Output(const Output&) = delete;
   Output& operator=(const Output&) = delete;
   ~Output();
@@ -52,7 +54,7 @@ class Output {
   void CheckInputs() const;
   [[noreturn]] void Fail(int error) const;
 
-  Content content_;
+  FileForm form_;
   std::string shown_;      // the name in messages
   std::string target_;     // what the temporary is renamed to
   std::string temporary_;  // empty if there is none

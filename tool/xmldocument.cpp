@@ -14,11 +14,11 @@
 #include "aldermoor/vexdoc/inspection.h"
 #include "aldermoor/vexdoc/vexexception.h"
 
+#include "completion.h"
 #include "diagnostics.h"
 #include "documentdiff.h"
 #include "documents.h"
 #include "inputfile.h"
-#include "options.h"
 #include "output.h"
 
 namespace Aldermoor::Tool {
@@ -65,18 +65,27 @@ std::string CheckedText(const Vexdoc::VEX& document, const std::string& shown, b
     Report(fmt::format("{}: XML cannot carry the document; nothing is written", shown));
     return "";
   }
+  // A load takes spectra without them, but what they are then nobody can tell.
+  if (!ReportMissing(Vexdoc::CompleteConditions(again, {}),
+                     "'aldermoor convert' with --condition")) {
+    Report(fmt::format("{}: conditions are missing; nothing is written", shown));
+    return "";
+  }
   if (const std::string digits = diff.DigitsText(); tell_digits && !digits.empty()) {
     Report(digits);
   }
   return out.str();
 }
 
-// Not beside a device, nor in a folder that takes no more files; the XML file is saved all the
-// same.
+// Not beside a device, nor over a document that was read, nor in a folder that takes no more files;
+// the XML file is saved all the same.
 bool HasPlaceForCache(const std::string& path) {
   namespace fs = std::filesystem;
   const fs::path file = path;
   if (fs::exists(file) && !fs::is_regular_file(file)) {
+    return false;
+  }
+  if (const auto input = InputThatIs(CachePath(path)); input && input->form != FileForm::kOther) {
     return false;
   }
   const fs::path folder = file.has_parent_path() ? file.parent_path() : ".";
@@ -92,32 +101,16 @@ void ForgetDates(Header& element) {
   element.RemoveAttribute(Header::kModifiedKey);
 }
 
-Vexdoc::LoadReport LoadStored(const std::string& path, Vexdoc::VEX& document,
-                              const Vexdoc::LoadOptions& options) {
-  return LoadStored(path, ReadBytes(path), document, options);
+void LoadStored(const std::string& path, Vexdoc::VEX& document) {
+  std::istringstream in(ReadBytes(path));
+  TryLoad(path, [&] { return document.Load(in, Vexdoc::LoadOptions()); });
 }
 
 Vexdoc::LoadReport LoadStored(const std::string& path, const std::string& text,
                               Vexdoc::VEX& document, const Vexdoc::LoadOptions& options) {
   std::istringstream in(text);
-  return TryLoad(path, [&] { return document.Load(in, options); });
-}
-
-void CompleteOption::AddTo(CLI::App& app) {
-  AddFlag(app, "--complete", is_set,
-          "Where the wavelengths of a spectrum are not those of its conditions, take minimum, "
-          "maximum and number from its points, if they have one step");
-}
-
-Vexdoc::WavelengthUse CompleteOption::GetUse() const {
-  return is_set ? Vexdoc::WavelengthUse::kComplete : Vexdoc::WavelengthUse::kRefuse;
-}
-
-void ReportRanges(const std::string& path, const Vexdoc::LoadReport& report) {
-  for (const auto& [range, spectra] : report.ranges_taken) {
-    Report(fmt::format("{}: the range {} taken from the points of {} {}", ShownPath(path), range,
-                       spectra, spectra == 1 ? "spectrum" : "spectra"));
-  }
+  return TryLoad(
+      path, [&] { return document.Load(in, options); }, "--complete");
 }
 
 ExitStatus SaveChecked(const Vexdoc::VEX& document, const std::string& path, bool cache,
@@ -129,14 +122,14 @@ ExitStatus SaveChecked(const Vexdoc::VEX& document, const std::string& path, boo
     return ExitStatus::kSomeFailed;
   }
   if (standard) {
-    Output output(path, Output::Content::kDocument);
+    Output output(path, FileForm::kXml);
     output.Write(text);
     output.Commit();
     return ExitStatus::kDone;
   }
   try {
     Utilities::FileSystem::File file(path);
-    ReportReplacedInput(path);
+    ReplaceInput(path, FileForm::kXml);
     document.SaveXML(file, cache && HasPlaceForCache(path));
     return ExitStatus::kDone;
   } catch (const Utilities::Exceptions::ResourceException& e) {

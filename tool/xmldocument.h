@@ -8,10 +8,6 @@
 
 #include "exitstatus.h"
 
-namespace CLI {
-class App;
-}
-
 /// Documents on their way through a command that writes one.
 namespace Aldermoor::Tool {
 
@@ -20,27 +16,15 @@ void ForgetDates(Vexdoc::Header& element);
 
 /// Reads the XML file `path`, "-" for standard input, and not its cache.  What has no dates in the
 /// file has none afterwards.
-/// Throws: InputError with the place of the fault in front, as far as it is known; RefusedError for
-/// spectra whose wavelengths are not those of their conditions.
-Vexdoc::LoadReport LoadStored(const std::string& path, Vexdoc::VEX& document,
-                              const Vexdoc::LoadOptions& options = {});
-/// The same from `text`, which is that of the file.
+/// Throws: as TryLoad does.
+void LoadStored(const std::string& path, Vexdoc::VEX& document);
+/// The same from `text`, which is that of the file, for a command that has "--complete".
 Vexdoc::LoadReport LoadStored(const std::string& path, const std::string& text,
                               Vexdoc::VEX& document, const Vexdoc::LoadOptions& options);
 
-/// The option "--complete" of the commands that write documents.
-struct CompleteOption {
-  bool is_set = false;
-
-  void AddTo(CLI::App& app);
-  Vexdoc::WavelengthUse GetUse() const;
-};
-/// Tells what ranges of wavelengths were taken from the points of `path`.
-void ReportRanges(const std::string& path, const Vexdoc::LoadReport& report);
-
 /// Writes `document` as XML to `path`, "-" for standard output, and with `cache` its cache, if that
-/// text read again gives the same document up to six digits of its numbers; otherwise reports what
-/// differs and touches nothing.
+/// text read again gives the same document up to six digits of its numbers, and none of its
+/// attributes lacks mandatory conditions; otherwise reports what is at fault and touches nothing.
 ///
 /// With `tell_digits`, reports how many values lose digits.  Throws: OutputError.
 ExitStatus SaveChecked(const Vexdoc::VEX& document, const std::string& path, bool cache,

@@ -28,6 +28,7 @@ from aldermoor._core import (
     load,
     loads,
     reconstruct,
+    release_unused_conditions,
 )
 from aldermoor._errors import (
     Error,
@@ -87,4 +88,5 @@ __all__ = [
     "load",
     "loads",
     "reconstruct",
+    "release_unused_conditions",
 ]

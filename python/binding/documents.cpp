@@ -431,6 +431,11 @@ What a file would not bring back, as a list of Fault: counts that differ from th
 that are missing, NaN.  Empty for a document that `save` writes.)");
 }
 
+unsigned long ReleaseUnusedConditions() {
+  const LibraryAlone alone;
+  return Vexdoc::ReleaseUnusedConditions();
+}
+
 }  // namespace
 
 void AddDocuments(py::module_& module) {
@@ -464,6 +469,13 @@ MissingConditionError for what is still missing after a completion.)",
 The document in XML, as `dumps` gives it; arguments as for load.)",
              arg("text"), py::kw_only(), arg("complete") = py::none(),
              arg("wavelengths") = "check");
+  module.def("release_unused_conditions", &ReleaseUnusedConditions,
+             R"(release_unused_conditions()
+--
+
+Frees the blocks of conditions that no attribute holds any more, and returns how many there were.
+Attributes of equal conditions share one block over all documents, and the process keeps each one
+that it has met; a program that goes through many documents calls this between them.)");
 }
 
 }  // namespace Aldermoor::Python

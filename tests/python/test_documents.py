@@ -201,3 +201,27 @@ def test_a_cache_never_answers_for_another_file_and_can_be_passed_over(tmp_path:
     assert aldermoor.load(path)["Set 1"].samples[0].name == "other"
     with pytest.raises(ValueError):
         aldermoor.load(path, cache=True, no_cache=True)
+
+
+def test_conditions_that_nobody_holds_any_more_are_released() -> None:
+    def stamped(count: int) -> aldermoor.Document:
+        document = aldermoor.Document("stamped")
+        samples = document.add_set("set")
+        for i in range(count):
+            sample = samples.add_sample(f"sample {i}")
+            sample.add_spectrum(numpy.ones(36), {"Measured.At": f"{i}:00"})
+            sample.add_spectrum(numpy.zeros(36), {"Measured.At": f"{i}:00"})
+        return document
+
+    gc.collect()
+    aldermoor.release_unused_conditions()
+    document = stamped(5)
+    kept = document["set"][0].attributes[1]
+    assert aldermoor.release_unused_conditions() == 0
+    del document
+    gc.collect()
+    assert aldermoor.release_unused_conditions() == 4
+    assert kept.conditions["Measured.At"] == "0:00"
+    del kept
+    gc.collect()
+    assert aldermoor.release_unused_conditions() == 1

@@ -22,7 +22,8 @@ TEST_F(DocumentsTest, MergeKeepsAllSetsAndTellsTheNewNames) {
   EXPECT_EQ(Shell("sed 's/Run 1/Run 2/' b.xml > c.xml").status, 0);
   const Result result = Run("merge a.xml b.xml c.xml -o all.xml");
   EXPECT_EQ(result.status, 0);
-  EXPECT_EQ(result.err,
+  EXPECT_TRUE(Holds(result.err, "a.xml:1:2739: warning: no attribute links to the conditions '2'"));
+  EXPECT_EQ(result.err.substr(result.err.find('\n') + 1),
             "aldermoor: b.xml: the set 'Set' becomes 'Set (1)'\n"
             "aldermoor: c.xml: the values of its header are left out where the first document has "
             "others: Name\n"
@@ -94,6 +95,32 @@ TEST_F(DocumentsTest, WhatAFileWouldNotBringBackIsToldForEverySampleAndNothingIs
   }
 }
 
+TEST_F(DocumentsTest, SpectraWithoutMandatoryConditionsComeThroughNoCommand) {
+  const std::string type = "<Attribute Name='Physical.SpectrumType'>Remission</Attribute>";
+  std::string text = ReadFile("a.xml");
+  text.erase(text.find(type), type.size());
+  WriteFile("current.xml", text);
+  WriteFile("legacy.xml", text.erase(text.find(" Version='1.0'"), 14));
+  for (const std::string file : {"current.xml", "legacy.xml"}) {
+    for (const std::string& command :
+         std::vector<std::string>{"convert " + file + " old.xml", "merge " + file + " -o old.xml",
+                                  "extract " + file + " --set Set -o old.xml"}) {
+      for (const char* const option : {"", " --complete"}) {
+        const Result result = Run(command + option);
+        EXPECT_EQ(result.status, 1) << command << option;
+        EXPECT_TRUE(Holds(result.err,
+                          "set 'Set', sample 'x': the conditions of a spectrum lack "
+                          "Physical.SpectrumType; "))
+            << command;
+        EXPECT_TRUE(Holds(result.err, "conditions are missing; nothing is written")) << command;
+        EXPECT_EQ(ReadFile("old.xml"), "old") << command << option;
+      }
+    }
+  }
+  EXPECT_EQ(Run("convert legacy.xml c.xml --condition Physical.SpectrumType=Remission").status, 0);
+  EXPECT_EQ(Run("extract c.xml --set Set -o old.xml").status, 0);
+}
+
 TEST_F(DocumentsTest, ExtractKeepsWhatPassesAndTheHeader) {
   ASSERT_EQ(Run("merge a.xml b.xml -o all.xml").status, 0);
   EXPECT_EQ(Run("extract all.xml --sample y -o y.xml").status, 0);
@@ -131,6 +158,9 @@ TEST_F(DocumentsTest, CacheIsRebuiltUsedAndRemoved) {
   EXPECT_TRUE(Holds(Run("cache a.xml").out, "not used: broken at 0x"));
   EXPECT_TRUE(Holds(Run("check a.xml").err, "a.xml: the cache is not used: broken at 0x"));
   EXPECT_EQ(Run("check a.xml").status, 0);
+  EXPECT_EQ(Run("check --no-cache a.xml").err, "");
+  EXPECT_EQ(Run("check --no-cache a.xml").status, 0);
+  EXPECT_FALSE(Holds(Run("check --no-cache --format json a.xml").out, "\"cache\""));
   EXPECT_TRUE(Holds(Run("check --format json a.xml").out, R"("used": false)"));
   EXPECT_EQ(Run("cache --remove a.xml").out, "a.xml: Cache/a.vexb: removed\n");
   EXPECT_EQ(Shell("ls Cache").out, "") << "nor is there a stamp";

@@ -112,6 +112,51 @@ TEST_F(OutputTest, NoInputIsReplacedByWhatIsNoDocument) {
   EXPECT_EQ(Shell("ls | grep -c '\\.......$'").out, "0\n") << "no temporary file is left";
 }
 
+TEST_F(OutputTest, NothingIsWrittenOverWhatBelongsToAnInput) {
+  WriteFile("a.csv", "Name\nx\n");
+  ASSERT_EQ(Shell("mkdir up; mv a.xml up/a.XML; cp up/a.XML v.xml; cp v.xml new.xml;"
+                  "ln -s v.xml l.xml; ln -s Cache/v.vexb lc; ln -s Cache store;"
+                  "aldermoor cache --rebuild v.xml up/a.XML > /dev/null")
+                .status,
+            0);
+  const char* const everything = "find . -type f | sort | xargs cksum";
+  const std::string before = Shell(everything).out;
+  const char* const cases[] = {
+      "dump Cache/v.vexb -o v.xml",
+      "dump lc -o l.xml",
+      "dump store/v.vexb -o v.xml",
+      "dump - -o v.xml < Cache/v.vexb",
+      "dump Cache/v.vexb >> v.xml",
+      "dump up/Cache/a.vexb -o up/a.XML",
+      "check Cache/v.vexb -o v.xml",
+      "check v.xml Cache/v.vexb.stamp -o v.xml",
+      "check up/a.XML Cache/v.vexb -o l.xml",
+      "color v.xml -o Cache/v.vexb",
+      "color v.xml -o Cache/v.vexb.stamp",
+      "color l.xml -o Cache/v.vexb",
+      "color l.xml -o lc",
+      "color - -o store/v.vexb < v.xml",
+      "color new.xml -o Cache/new.vexb",
+      "color new.xml -o Cache/new.vexb.stamp",
+      "spectrum --input v.xml --save Cache/v.vexb",
+      "extract v.xml --set Set -o Cache/v.vexb",
+      "extract v.xml --set Set -o Cache/v.vexb.stamp",
+      "merge new.xml l.xml -o lc",
+      "convert v.xml Cache/v.vexb",
+      "convert v.xml --to csv v.xml",
+      "convert l.xml --to csv v.xml",
+      "convert a.csv a.csv --to xml",
+  };
+  for (const char* const command : cases) {
+    const Result result = Run(command);
+    EXPECT_EQ(result.status, 2) << command << result.err;
+    EXPECT_TRUE(Holds(result.err, "would be written over the input ")) << command;
+    EXPECT_EQ(Shell(everything).out, before) << command;
+  }
+  EXPECT_EQ(Run("dump Cache/v.vexb -o new.xml").status, 0) << "another document";
+  EXPECT_EQ(Run("convert v.xml v.xml").status, 0) << "which writes the cache too";
+}
+
 TEST_F(OutputTest, DocumentThatTakesThePlaceOfItsInputSaysSo) {
   WriteFile("a.csv", "Name\nx\n");
   for (const std::string command :

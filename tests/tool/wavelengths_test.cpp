@@ -109,27 +109,80 @@ TEST_F(WavelengthsTest, ConditionsAreTakenAsTheFormatReadsThem) {
   EXPECT_EQ(Run("convert a.xml old.xml --strict").status, 1);
 }
 
-TEST_F(WavelengthsTest, ConvertTellsWhatIsLostAndStrictRefusesIt) {
-  const std::pair<const char*, const char*> cases[] = {
+// The commands that write the document "a.xml", as far as the name of the output.
+const std::string kWriters[] = {"convert a.xml ", "merge a.xml -o ", "extract a.xml --set S -o "};
+
+TEST_F(WavelengthsTest, WhatIsLostIsToldByAllThatWriteDocumentsAndStrictRefusesIt) {
+  const std::string lab =
+      "<ColorVector Conditions='2'><Value Name='b*'>50</Value><Value Name='a*'>1</Value><Value "
+      "Name='L*'>2</Value></ColorVector>";
+  const std::string dialects[] = {"<VEX Version='1.0'>", "<VEX>"};
+  const struct {
+    std::string content;
+    const char* told;
+    bool is_kept = false;  // by the current dialect
+  } cases[] = {
       {"<Recipe Conditions='1'><Thickness>1,5</Thickness></Recipe>", "'1,5' is no number"},
       {"<Recipe Conditions='1'><!-- --></Recipe>", "a comment is not kept"},
       {"<Recipe Conditions='1'><Creator><![CDATA[me]]></Creator></Recipe>",
        "the text of 'Creator'"},
       {"<Recipe Conditions='1' Date='x'/>", "the attribute 'Date' of 'Recipe' is not read"},
+      {lab, "labelled 'b*', 'a*', 'L*' but count by position, as 'L*', 'a*', 'b*'", true},
   };
-  for (const auto& [content, told] : cases) {
+  for (const auto& one : cases) {
     WriteDocument("a.xml", "S",
-                  SampleXml("x", 0.5) + "<Sample><Name>x</Name><SampleAttribute>" + content +
+                  SampleXml("x", 0.5) + "<Sample><Name>x</Name><SampleAttribute>" + one.content +
                       "</SampleAttribute></Sample>" + LabSampleXml("z", "1", "2", "3"));
-    const Result lax = Run("convert a.xml out.xml");
-    EXPECT_EQ(lax.status, 0) << lax.err;
-    EXPECT_TRUE(Holds(lax.err, told));
-    EXPECT_FALSE(Holds(lax.err, "already")) << "an equal name is no loss";
-    const Result strict = Run("convert a.xml old.xml --strict");
-    EXPECT_EQ(strict.status, 1);
-    EXPECT_TRUE(Holds(strict.err, told));
-    EXPECT_EQ(ReadFile("old.xml"), "old");
-    EXPECT_EQ(Run("convert out.xml out.xml --strict").status, 0) << "what was written is whole";
+    const std::string text = ReadFile("a.xml");
+    for (const std::string& dialect : dialects) {
+      WriteFile("a.xml", dialect + text.substr(text.find('>', text.find("<VEX")) + 1));
+      for (const std::string& writer : kWriters) {
+        const Result lax = Run(writer + "out.xml");
+        EXPECT_EQ(lax.status, 0) << lax.err;
+        EXPECT_TRUE(Holds(lax.err, one.told)) << writer;
+        EXPECT_FALSE(Holds(lax.err, "already")) << "an equal name is no loss";
+        const Result strict = Run(writer + "old.xml --strict");
+        EXPECT_EQ(strict.status, 1) << writer;
+        EXPECT_TRUE(Holds(strict.err, one.told)) << writer;
+        EXPECT_TRUE(Holds(strict.err, "a.xml: --strict; nothing is written")) << writer;
+        EXPECT_EQ(ReadFile("old.xml"), "old");
+        EXPECT_EQ(Run("convert out.xml out.xml --strict").status,
+                  one.is_kept && dialect == dialects[0] ? 1 : 0)
+            << "what was written is whole";
+      }
+    }
+  }
+}
+
+TEST_F(WavelengthsTest, CompletionIsProposedWhereItHelpsOnly) {
+  const std::string remedy = "takes the range from the points";
+  WriteSpectrum("a.xml", 400, "380nm", "730nm");
+  EXPECT_TRUE(Holds(Run("color a.xml").err, "; 'aldermoor convert --complete' " + remedy));
+  EXPECT_TRUE(
+      Holds(Run("cache --rebuild a.xml").err, "; 'aldermoor convert --complete' " + remedy));
+  for (const std::string& writer : kWriters) {
+    EXPECT_TRUE(Holds(Run(writer + "old.xml").err, "; --complete " + remedy)) << writer;
+  }
+  EXPECT_EQ(Shell("sed \"s/Name='410'/Name='411'/\" a.xml > b.xml; mv b.xml a.xml").status, 0);
+  for (const std::string& writer : kWriters) {
+    for (const char* const option : {"", " --complete"}) {
+      const Result uneven = Run(writer + "old.xml" + option);
+      EXPECT_EQ(uneven.status, 1) << writer;
+      EXPECT_FALSE(Holds(uneven.err, remedy)) << writer << option;
+    }
+  }
+  // An illuminant has no range of its own, whatever its points are.
+  WriteSpectrum("a.xml", 380, "380nm", "730nm");
+  std::string text = ReadFile("a.xml");
+  std::string light = text.substr(text.find("<Spectrum"));
+  light = light.substr(0, light.find("</Spectrum>") + 11);
+  light.replace(light.find("'380'"), 5, "'381'");
+  text.insert(text.find("<ID>2</ID>") + 10, light);
+  WriteFile("a.xml", text);
+  for (const char* const command : {"color a.xml", "convert a.xml old.xml"}) {
+    const Result result = Run(command);
+    EXPECT_TRUE(Holds(result.err, "the illuminant of the conditions '2'")) << command;
+    EXPECT_FALSE(Holds(result.err, remedy)) << command;
   }
 }
 

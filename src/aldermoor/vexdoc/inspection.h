@@ -32,11 +32,12 @@ struct Fault {
   unsigned int column = 0;
   /// The place in a cache: the first byte of the field, counted from 0.  0 in a text.
   unsigned long long offset = 0;
-  /// What the document that is read from the file does not say, though the file does.
+  /// What the document that is read from the file does not say, or not in the same way.
   enum class Loss {
     kNone,
     kContent,
     kWavelengths,  ///< Those of a spectrum, which are not those of its conditions; see LoadOptions.
+    kLabels,       ///< Kept, but the values count for other channels than the labels name.
   };
   Loss loss = Loss::kNone;
   /// Further faults, elsewhere, that differ from this one in quoted texts and numbers only.  They

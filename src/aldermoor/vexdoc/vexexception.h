@@ -30,7 +30,14 @@ class ALDERMOOR_EXPORT VexParseException : public VexException {
 /// sample, points and conditions, a line each.
 class ALDERMOOR_EXPORT WavelengthException : public VexParseException {
  public:
-  using VexParseException::VexParseException;
+  WavelengthException(const std::string& message, const std::string& location, bool can_complete)
+      : VexParseException(message, location), can_complete_(can_complete) {}
+
+  /// Whether a load with WavelengthUse::kComplete would get past what this one refuses.
+  bool CanComplete() const { return can_complete_; }
+
+ private:
+  bool can_complete_;
 };
 
 /// The text of a document is not well-formed XML.

@@ -3,11 +3,11 @@
 #include <gtest/gtest.h>
 
 #include "aldermoor/utilities/exceptions/exceptions.h"
-#include "aldermoor/vexdoc/internals/binarydumper.h"
 #include "aldermoor/vexdoc/internals/binaryloader.h"
 #include "aldermoor/vexdoc/internals/conditionmanager.h"
 
 #include "tests/vexdoc/internals/loadsupport.h"
+#include "tests/vexdoc/internals/writesupport.h"
 
 namespace Aldermoor::Vexdoc::Testing {
 namespace {
@@ -65,10 +65,7 @@ TEST(DamageCheckTest, ErrorsAreToldOfExactlyTheDamagesThatDoNotLoad) {
   ExpectTheVerdictOfTheLoader(&CheckXML, text);
   VEX document;
   LoadText(document, text);
-  std::ostringstream out;
-  Internals::BinaryDumper dumper(out);
-  document.AcceptVisitor(dumper);
-  ExpectTheVerdictOfTheLoader(&CheckCache, out.str());
+  ExpectTheVerdictOfTheLoader(&CheckCache, CacheOf(document));
 }
 
 // With one block for spectra of a point and one for colours, both in use.
@@ -144,6 +141,10 @@ TEST(XmlCheckTest, WhatNoDocumentHoldsIsALoss) {
       {"<Creator lang='de'>me</Creator>", "the attribute 'lang' of 'Creator' is not read"},
       {"<AdditionalData><Value Name='a' Unit='b'/></AdditionalData>",
        "of the attributes of 'Value' only 'Name' is kept"},
+      {"<AdditionalData><Value Name='a'>1</Value><Value Name='a'>2</Value></AdditionalData>",
+       "'a' is given again; the last one counts"},
+      {"<AdditionalData><Value Name='Creator'>1</Value></AdditionalData><Creator>2</Creator>",
+       "'Creator' is given again; the last one counts"},
       {"<SampleAttribute><Recipe Conditions='1' Date='x'/></SampleAttribute>",
        "the attribute 'Date' of 'Recipe' is not read"},
       {"<SampleAttribute><Gloss Conditions='1' Zone='x'/></SampleAttribute>",
@@ -164,6 +165,68 @@ TEST(XmlCheckTest, WhatNoDocumentHoldsIsALoss) {
     }
     EXPECT_EQ(losses, told) << content;
   }
+}
+
+// A document with one colour.
+std::string ColorXml(const std::string& version, const std::string& space,
+                     const std::vector<std::string>& labels) {
+  std::string text = "<VEX" + version +
+                     "><Name/><SampleSet><Name/><Sample><Name/><SampleAttribute><ColorVector "
+                     "Conditions='1'>";
+  for (const std::string& label : labels) {
+    text += "<Value Name=\"" + label + "\">1</Value>";
+  }
+  return text +
+         "</ColorVector></SampleAttribute></Sample></SampleSet><Conditions><ID>1</ID>"
+         "<Attribute Name='ColorSpaceDescription.Type'>" +
+         space +
+         "</Attribute><Attribute Name='Colorimetric.Illumination'>D50</Attribute>"
+         "<Attribute Name='Colorimetric.Observer'>TwoDegree</Attribute></Conditions></VEX>";
+}
+
+TEST(ColorCheckTest, LabelsOtherThanThoseOfTheColorSpaceAreTold) {
+  const struct {
+    std::string space;
+    std::vector<std::string> labels;
+    bool is_own;
+  } cases[] = {
+      {"CIELab", {"L*", "a*", "b*"}, true},
+      {"CIELab", {"delta L*", "delta a*", "delta b*"}, true},
+      {"CIELab", {"b*", "a*", "L*"}, false},
+      {"CIELab", {"L*", "a*", "delta b*"}, false},
+      {"CIELab", {"X", "Y", "Z"}, false},
+      {"CIELab", {"l*", "a*", "b*"}, false},
+      {"CIELab", {"", "", ""}, false},
+      {"CIEXYZ", {"X", "Y", "Z"}, true},
+      {"CIEXYZ", {"L*", "a*", "b*"}, false},
+      {"RGB", {"B", "G", "R"}, false},
+      {"CMYK", {"C", "M", "Y", "K"}, true},
+      {"CMYK", {"delta C", "delta M", "delta Y", "delta K"}, true},
+      {"CMYK", {"K", "C", "M", "Y"}, false},
+  };
+  for (const auto& one : cases) {
+    for (const std::string version : {"", " Version='1.0'"}) {
+      const std::string text = ColorXml(version, one.space, one.labels);
+      std::istringstream in(text);
+      const std::vector<Fault> faults = CheckXML(in);
+      ASSERT_EQ(faults.size(), one.is_own ? 0U : 1U) << text;
+      if (!one.is_own) {
+        EXPECT_EQ(faults[0].severity, Fault::Severity::kWarning);
+        EXPECT_EQ(faults[0].loss, version.empty() ? Fault::Loss::kContent : Fault::Loss::kLabels);
+      }
+    }
+    std::istringstream in(ColorXml(" Version='1.0'", one.space, one.labels));
+    VEX document;
+    document.Load(in);
+    EXPECT_EQ(Told(&CheckCache, CacheOf(document)).empty(), one.is_own)
+        << one.space << one.labels[0];
+  }
+  EXPECT_EQ(Told(&CheckXML, ColorXml("", "CIELab", {"b*", "a*", "L*"})),
+            "1:63 warning: the channels are labelled 'b*', 'a*', 'L*' but count by position, as "
+            "'L*', 'a*', 'b*'\n");
+  EXPECT_EQ(Told(&CheckXML, ColorXml(" Version='1'", "Paint", {"b*", "a*"})), "")
+      << "the labels are all that names its channels";
+  EXPECT_EQ(Told(&CheckXML, ColorXml(" Version='1'", "Undefined", {"b*", "a*", "x"})), "");
 }
 
 TEST(XmlCheckTest, WavelengthsOtherThanThoseOfTheConditionsAreToldBesideTheErrors) {

@@ -1,5 +1,6 @@
 #include "aldermoor/vexdoc/internals/attributerules.h"
 
+#include <algorithm>
 #include <exception>
 #include <stdexcept>
 
@@ -9,6 +10,7 @@
 #include "aldermoor/vexdoc/conditionkeys.h"
 #include "aldermoor/vexdoc/elementtyper.h"
 #include "aldermoor/vexdoc/internals/elementfactory.h"
+#include "aldermoor/vexdoc/internals/faulttext.h"
 #include "aldermoor/vexdoc/mandatoryconditions.h"
 
 namespace Aldermoor::Vexdoc::Internals {
@@ -39,6 +41,14 @@ void AddChannelFault(const std::string& color_space, const Data& data,
   } catch (const std::exception& e) {
     faults.emplace_back(e.what());
   }
+}
+
+std::string QuotedList(const std::vector<std::string>& texts) {
+  std::string list;
+  for (const std::string& text : texts) {
+    list += (list.empty() ? "" : ", ") + Quoted(text);
+  }
+  return list;
 }
 
 }  // namespace
@@ -96,6 +106,22 @@ std::vector<std::string> LegacyColorFaults(const Conditions& conditions, std::si
                     std::vector<float>(channels), faults);
   }
   return faults;
+}
+
+std::string LabelFault(const Conditions& conditions, const std::vector<std::string>& labels) {
+  const std::string color_space = conditions.GetAttribute(ConditionKeys::kColorSpace, "");
+  if (!IsKnownColorSpace(color_space)) {
+    return "";
+  }
+  // Those of absolute values stand in front of those of differences.  "Undefined" has none.
+  const std::vector<std::string>& own = GetChannelLabels(color_space);
+  const auto half = own.begin() + static_cast<std::ptrdiff_t>(own.size() / 2);
+  if (own.empty() || std::equal(own.begin(), half, labels.begin(), labels.end()) ||
+      std::equal(half, own.end(), labels.begin(), labels.end())) {
+    return "";
+  }
+  return "the channels are labelled " + QuotedList(labels) + " but count by position, as " +
+         QuotedList({own.begin(), half});
 }
 
 }  // namespace Aldermoor::Vexdoc::Internals

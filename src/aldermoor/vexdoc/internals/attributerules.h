@@ -43,6 +43,11 @@ std::vector<std::string> ColorFaults(const Conditions& conditions, std::size_t c
 /// The same for the legacy dialect, where the colour space names the channels.
 std::vector<std::string> LegacyColorFaults(const Conditions& conditions, std::size_t channels);
 
+/// Whether the channels of a colour in a known space bear other labels than the space has for them,
+/// those of absolute values or of differences, in its order: a line that says so, or nothing.
+/// Readers take values by position, so such ones may count for another channel than was meant.
+std::string LabelFault(const Conditions& conditions, const std::vector<std::string>& labels);
+
 }  // namespace Aldermoor::Vexdoc::Internals
 
 #endif  // ALDERMOOR_VEXDOC_INTERNALS_ATTRIBUTERULES_H

@@ -129,13 +129,13 @@ void CacheWalker::WalkAttribute(std::size_t offset, const std::string& kind) {
     attribute.count = FloatVector();
   } else if (kind == "ColorVector") {
     attribute.kind = Attribute::Kind::kColor;
-    attribute.count = Pairs("channel", "label");
+    attribute.count = Pairs("channel", "label", &attribute.labels);
   } else if (kind == "Recipe") {
     WalkRecipe();
   } else {
     WalkDataTree(1);
   }
-  attributes_.push_back(attribute);
+  attributes_.push_back(std::move(attribute));
 }
 
 void CacheWalker::WalkRecipe() {
@@ -208,9 +208,7 @@ void CacheWalker::CheckAttributes() {
     if (attribute.kind == Attribute::Kind::kSpectrum) {
       CheckSpectrum(attribute, block);
     } else if (attribute.kind == Attribute::Kind::kColor) {
-      for (const std::string& fault : ColorFaults(block.conditions, attribute.count)) {
-        Error(attribute.offset, fault);
-      }
+      CheckColor(attribute, block);
     }
   }
   for (const auto& [id, block] : blocks_) {
@@ -233,6 +231,17 @@ void CacheWalker::CheckSpectrum(const Attribute& spectrum, Block& block) {
     for (const std::string& fault : SpectrumFaults(block.conditions)) {
       Warn(block.offset, fault);
     }
+  }
+}
+
+void CacheWalker::CheckColor(const Attribute& color, const Block& block) {
+  const auto faults = ColorFaults(block.conditions, color.count);
+  for (const std::string& fault : faults) {
+    Error(color.offset, fault);
+  }
+  if (const std::string fault = LabelFault(block.conditions, color.labels);
+      faults.empty() && !fault.empty()) {
+    Warn(color.offset, fault);
   }
 }
 
@@ -288,11 +297,15 @@ std::size_t CacheWalker::FloatVector() {
   return count;
 }
 
-std::size_t CacheWalker::Pairs(const char* noun, const char* label) {
+std::size_t CacheWalker::Pairs(const char* noun, const char* label,
+                               std::vector<std::string>* texts) {
   const std::size_t count = Count(noun, kEntrySize);
   const Deeper deeper(depth_);
   for (std::size_t i = 0; i < count; ++i) {
-    Text(label);
+    const std::string_view text = Text(label);
+    if (texts != nullptr) {
+      texts->emplace_back(text);
+    }
     Float("value");
   }
   return count;

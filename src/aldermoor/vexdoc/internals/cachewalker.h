@@ -56,6 +56,7 @@ class CacheWalker {
     std::size_t offset;
     std::size_t count;  // of points or channels
     std::string_view id;
+    std::vector<std::string> labels = {};  // of channels
   };
   struct Block {
     std::size_t offset = 0;
@@ -75,6 +76,7 @@ class CacheWalker {
   void WalkBlock();
   void CheckAttributes();
   void CheckSpectrum(const Attribute& spectrum, Block& block);
+  void CheckColor(const Attribute& color, const Block& block);
 
   std::uint32_t Number(const char* label, CacheField::Kind kind = CacheField::Kind::kNumber);
   // Of records that take at least `size` bytes each.
@@ -82,7 +84,8 @@ class CacheWalker {
   std::string_view Text(const char* label);
   void Float(const char* label);
   std::size_t FloatVector();
-  std::size_t Pairs(const char* noun, const char* label);
+  // Adds the texts to `texts` unless it is null.
+  std::size_t Pairs(const char* noun, const char* label, std::vector<std::string>* texts = nullptr);
   // Calls `entry(key, value)` for each entry.
   template <class Entry>
   void Map(const char* noun, Entry entry);

@@ -43,7 +43,7 @@ std::string RangeText(const Wavelengths& points) {
          std::to_string(points.back()) + "nm";
 }
 
-[[noreturn]] void Refuse(const LoadReport& report) {
+[[noreturn]] void Refuse(const LoadReport& report, bool can_complete) {
   constexpr std::size_t kMostInText = 3;
   std::string text = "the wavelengths are not those of the conditions";
   for (std::size_t i = 0; i < std::min(kMostInText, report.contradictions.size()); ++i) {
@@ -52,7 +52,8 @@ std::string RangeText(const Wavelengths& points) {
   if (report.contradiction_count > kMostInText) {
     text += "\nand " + std::to_string(report.contradiction_count - kMostInText) + " more";
   }
-  throw WavelengthException(text, ALDERMOOR_HERE(Aldermoor::Vexdoc::Internals::LoadNotes::Settle));
+  throw WavelengthException(text, ALDERMOOR_HERE(Aldermoor::Vexdoc::Internals::LoadNotes::Settle),
+                            can_complete);
 }
 
 }  // namespace
@@ -116,9 +117,9 @@ void LoadNotes::Settle(VEX& document, const LoadOptions& options, LoadReport& re
   report.contradictions.assign(illuminations_.begin(),
                                illuminations_.begin() + static_cast<std::ptrdiff_t>(listed));
   report.contradiction_count = illuminations_.size();
-  FindContradictions(document, options, report);
+  const bool can_complete = FindContradictions(document, options, report) && illuminations_.empty();
   if (report.contradiction_count > 0 && options.wavelengths != WavelengthUse::kReport) {
-    Refuse(report);
+    Refuse(report, can_complete);
   }
 }
 
@@ -139,8 +140,9 @@ void LoadNotes::TakeRanges(const VEX& document, LoadReport& report) const {
   });
 }
 
-void LoadNotes::FindContradictions(const VEX& document, const LoadOptions& options,
+bool LoadNotes::FindContradictions(const VEX& document, const LoadOptions& options,
                                    LoadReport& report) const {
+  bool can_complete = options.wavelengths != WavelengthUse::kComplete;
   Agreement agreement;
   ForEachSpectrum(document, [&](const SampleSet& set, const Sample& sample,
                                 const SampleAttribute& spectrum, const Wavelengths& points) {
@@ -150,6 +152,7 @@ void LoadNotes::FindContradictions(const VEX& document, const LoadOptions& optio
         (agreement.Of(points, conditions) || (options.completion && !NamesRange(conditions)))) {
       return;
     }
+    can_complete = can_complete && misread == misread_.end() && AreRegular(points);
     if (++report.contradiction_count > LoadReport::kMostListed) {
       return;
     }
@@ -164,6 +167,7 @@ void LoadNotes::FindContradictions(const VEX& document, const LoadOptions& optio
                     : "")});
     }
   });
+  return can_complete;
 }
 
 }  // namespace Aldermoor::Vexdoc::Internals

@@ -38,7 +38,8 @@ class LoadNotes {
 
  private:
   void TakeRanges(const VEX& document, LoadReport& report) const;
-  void FindContradictions(const VEX& document, const LoadOptions& options,
+  // Returns whether the points of all that it finds could give the range.
+  bool FindContradictions(const VEX& document, const LoadOptions& options,
                           LoadReport& report) const;
   // Calls `visit(set, sample, spectrum, points)`.
   template <class Visit>

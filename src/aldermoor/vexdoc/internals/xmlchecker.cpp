@@ -252,21 +252,28 @@ void XMLChecker::CheckSpectrum(const NodeHolder& spectrum, Block* block) {
 void XMLChecker::CheckColor(const NodeHolder& color, const Block* block) {
   CheckContainer(color, kConditions);
   CheckHeader(color, false, {kValue});
-  std::size_t channels = 0;
-  ForEachElement(color, kValue, [this, &channels](const NodeHolder& value) {
+  std::vector<std::string> labels;
+  ForEachElement(color, kValue, [this, &labels](const NodeHolder& value) {
     const DOMNode* const attribute = value.FirstAttribute();
     if (attribute == nullptr || !XMLString::equals(attribute->getNodeName(), kName)) {
       return WarnOfLoss(value, "'Value' is not read: its first attribute is not 'Name'");
     }
-    ++channels;
+    labels.push_back(ToNativeString(attribute->getNodeValue()));
     CheckNumber(value, true);
   });
   if (block == nullptr) {
     return;
   }
-  for (const std::string& fault : is_legacy_ ? LegacyColorFaults(block->conditions, channels)
-                                             : ColorFaults(block->conditions, channels)) {
+  const auto faults = is_legacy_ ? LegacyColorFaults(block->conditions, labels.size())
+                                 : ColorFaults(block->conditions, labels.size());
+  for (const std::string& fault : faults) {
     Error(color, fault);
+  }
+  if (const std::string fault = LabelFault(block->conditions, labels);
+      faults.empty() && !fault.empty()) {
+    // The legacy dialect forgets the labels, so that nothing shows what they were.
+    Add(Fault::Severity::kWarning, color, fault,
+        is_legacy_ ? Fault::Loss::kContent : Fault::Loss::kLabels);
   }
 }
 
@@ -308,9 +315,27 @@ void XMLChecker::CheckDataTree(const NodeHolder& node, bool is_root) {
                  [this](const NodeHolder& child) { CheckDataTree(child, false); });
 }
 
+void XMLChecker::CheckAdditional(const std::vector<NodeHolder>& values,
+                                 const std::set<const XMLCh*>& elements) {
+  std::set<std::string> keys;
+  for (const auto& [element, key] : kHeaderKeys) {
+    if (elements.contains(element)) {
+      keys.insert(key);
+    }
+  }
+  for (const NodeHolder& value : values) {
+    const xercesc::DOMNode* const key = value.FirstAttribute();
+    if (key != nullptr && !keys.insert(ToNativeString(key->getNodeValue())).second) {
+      WarnOfLoss(value, Quoted(ToNativeString(key->getNodeValue())) +
+                            " is given again; the last one counts");
+    }
+  }
+}
+
 void XMLChecker::CheckHeader(const NodeHolder& holder, bool is_name_mandatory,
                              ElementNames others) {
   std::set<const XMLCh*> seen;
+  std::vector<NodeHolder> additional;  // read behind the others, wherever they stand
   bool has_additional_data = false;
   ForEachElement(holder, kAnyElement, [&](const NodeHolder& child) {
     const auto key = std::find_if(std::begin(kHeaderKeys), std::end(kHeaderKeys),
@@ -325,8 +350,9 @@ void XMLChecker::CheckHeader(const NodeHolder& holder, bool is_name_mandatory,
         WarnOfLoss(child, "'AdditionalData' is given again; the first one counts");
       }
       CheckContainer(child);
-      ForEachElement(child, kAnyElement, [this](const NodeHolder& value) {
+      ForEachElement(child, kAnyElement, [&](const NodeHolder& value) {
         CheckLeaf(value, true);
+        additional.push_back(value);
         if (value.FirstAttribute() == nullptr) {
           WarnOfLoss(value, Quoted(value.GetName()) + " is not read: it has no key");
         }
@@ -336,6 +362,7 @@ void XMLChecker::CheckHeader(const NodeHolder& holder, bool is_name_mandatory,
       WarnOfLoss(child, Quoted(child.GetName()) + " is not read here");
     }
   });
+  CheckAdditional(additional, seen);
   if (is_name_mandatory && !seen.contains(kName)) {
     Error(holder, Quoted(holder.GetName()) + " has no 'Name'");
   }

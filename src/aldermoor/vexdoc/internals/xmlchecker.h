@@ -53,6 +53,9 @@ class XMLChecker {
 
   // The header elements, and that there are no children but those and the `others`.
   void CheckHeader(const NodeHolder& holder, bool is_name_mandatory, ElementNames others);
+  // That `values` give no key of the header for a second time; `elements` have given theirs.
+  void CheckAdditional(const std::vector<NodeHolder>& values,
+                       const std::set<const XMLCh*>& elements);
   // That `names` does not hold the name of the element yet.
   void CheckIsFirst(const NodeHolder& element, const char* noun, std::set<std::string>& names);
   // The block to which an attribute links; null after a fault.
