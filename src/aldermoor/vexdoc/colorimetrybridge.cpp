@@ -32,8 +32,8 @@ namespace IlluminationType = Tristim::IlluminationType;
 using Tristim::Vocabulary::kUndefined;
 using Tristim::Vocabulary::kUserdefined;
 
-const std::string kIlluminationKey = Tristim::Vocabulary::kIlluminationKey;
-const std::string kColorSpaceKey = Tristim::Vocabulary::kColorSpaceKey;
+const std::string& kIlluminationKey = *new std::string(Tristim::Vocabulary::kIlluminationKey);
+const std::string& kColorSpaceKey = *new std::string(Tristim::Vocabulary::kColorSpaceKey);
 
 // The block that an attribute under ToConditions(conditions) gets.  As a rule it is there already,
 // and is found without the two dozen allocations of a Conditions of its own.

@@ -65,7 +65,7 @@ bool ColorVector::Equals(const SampleAttribute& other) const try {
 ALDERMOOR_FRAME(Aldermoor::Vexdoc::ColorVector::Equals)
 
 const std::vector<float>& ColorVector::GetData() const try {
-  static std::vector<float> values;
+  static std::vector<float>& values = *new std::vector<float>;
   values.clear();
   for (const auto& channel : GetDatastore()) {
     values.push_back(channel.second);

@@ -5,16 +5,16 @@
 namespace Aldermoor::Vexdoc {
 
 const std::vector<std::string>& MandatoryConditionsOfSpectra() {
-  static const std::vector<std::string> keys = {
-      ConditionKeys::kWavelengthMin, ConditionKeys::kWavelengthMax, ConditionKeys::kPointCount,
-      ConditionKeys::kSpectrumType};
+  static const auto& keys =
+      *new std::vector<std::string>{ConditionKeys::kWavelengthMin, ConditionKeys::kWavelengthMax,
+                                    ConditionKeys::kPointCount, ConditionKeys::kSpectrumType};
   return keys;
 }
 
 const std::vector<std::string>& MandatoryConditionsOfColors(const std::string& color_space) {
-  static const std::vector<std::string> all = {
+  static const auto& all = *new std::vector<std::string>{
       ConditionKeys::kColorSpace, ConditionKeys::kIllumination, ConditionKeys::kObserver};
-  static const std::vector<std::string> type_only = {ConditionKeys::kColorSpace};
+  static const auto& type_only = *new std::vector<std::string>{ConditionKeys::kColorSpace};
   return color_space == "RGB" || color_space == "CMYK" ? type_only : all;
 }
 

@@ -48,7 +48,7 @@ double Distance(const UvY& first, const UvY& second) {
 }
 
 const HXMeasureConditions& BaseConditions() {
-  static const HXMeasureConditions conditions = [] {
+  static const HXMeasureConditions& conditions = *new HXMeasureConditions([] {
     HXMeasureConditions result;
     result.SetMeasureCondition(Words::kIlluminationKey, Words::kEmission);
     result.SetMeasureCondition(Words::kObserverKey, "TwoDegree");
@@ -56,7 +56,7 @@ const HXMeasureConditions& BaseConditions() {
     result.SetMeasureCondition(Words::kDeltaEFormulaKey, Words::kCIELab);
     result.SetMeasureCondition(Words::kVectorKindKey, Words::kAbsoluteVector);
     return result;
-  }();
+  }());
   return conditions;
 }
 

@@ -3,13 +3,14 @@
 
 namespace Aldermoor::Utilities::Patterns {
 
-/// Base of a class with one object per process, built at first use and destroyed at process exit.
+/// Base of a class with one object per process, built at first use and never destroyed, so that
+/// destructors of static objects may still use it.
 /// `T` has a default constructor that only this base can reach.
 template <class T>
 class Singleton {
  public:
   static T& GetInstance() {
-    static T instance;
+    static T& instance = *new T;
     return instance;
   }
 

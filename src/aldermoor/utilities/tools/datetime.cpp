@@ -36,14 +36,14 @@ bool ReadThree(const std::string& text, char delimiter, std::array<long, 3>& num
 // localtime_r reads the time zone once for a process; an application may choose another one later.
 // Only a changed TZ is read again, since that looks at files and every new element asks for a date.
 void ReadChangedTimeZone() {
-  thread_local std::string known;
-  thread_local bool was_read = false;
+  // No string, which would be gone when the destructors of static objects run.
+  thread_local std::array<char, 64> known = {};
   const char* const zone = std::getenv("TZ");
-  const std::string_view present = zone == nullptr ? std::string_view("\n", 1) : zone;
-  if (!was_read || present != known) {
+  const std::string_view present = zone == nullptr ? std::string_view("\n") : zone;
+  if (present != known.data() || present.empty()) {
     tzset();
-    known = present;
-    was_read = true;
+    known = {};
+    present.copy(known.data(), known.size() - 1);  // a longer one is read each time
   }
 }
 
