@@ -64,10 +64,13 @@ bool IsLevel(std::string_view kind) {
 }
 
 WavelengthSteps::WavelengthSteps(const Conditions& conditions, std::size_t points)
-    : first(Wavelength(conditions, ConditionKeys::kWavelengthMin, "380")) {
-  const std::int16_t last = Wavelength(conditions, ConditionKeys::kWavelengthMax, "730");
+    : WavelengthSteps(Wavelength(conditions, ConditionKeys::kWavelengthMin, "380"),
+                      Wavelength(conditions, ConditionKeys::kWavelengthMax, "730"), points) {}
+
+WavelengthSteps::WavelengthSteps(std::int64_t minimum, std::int64_t maximum, std::size_t points)
+    : first(minimum) {
   if (points > 1) {
-    step = (last - first) / (static_cast<std::int64_t>(points) - 1);
+    step = (maximum - minimum) / (static_cast<std::int64_t>(points) - 1);
   }
 }
 

@@ -28,6 +28,7 @@ bool IsLevel(std::string_view kind);
 struct WavelengthSteps {
   /// Throws: std::invalid_argument if the range is no number or does not fit into 16 bits.
   WavelengthSteps(const Conditions& conditions, std::size_t points);
+  WavelengthSteps(std::int64_t minimum, std::int64_t maximum, std::size_t points);
 
   std::int64_t first;
   std::int64_t step = 0;  // also of a single point

@@ -1,7 +1,6 @@
 #include "aldermoor/vexdoc/internals/documentchecker.h"
 
 #include <algorithm>
-#include <charconv>
 #include <cmath>
 #include <iterator>
 #include <optional>
@@ -16,6 +15,7 @@
 #include "aldermoor/vexdoc/internals/attributerules.h"
 #include "aldermoor/vexdoc/internals/documentparser.h"
 #include "aldermoor/vexdoc/internals/faulttext.h"
+#include "aldermoor/vexdoc/internals/wavelengths.h"
 #include "aldermoor/vexdoc/internals/xmlnames.h"
 #include "aldermoor/vexdoc/recipe.h"
 #include "aldermoor/vexdoc/spectrum.h"
@@ -40,29 +40,6 @@ bool IsDate(const std::string& key) {
 bool IsStandardKey(const std::string& key) {
   return std::any_of(std::begin(XMLNames::kHeaderKeys), std::end(XMLNames::kHeaderKeys),
                      [&key](const auto& standard) { return key == standard.key; });
-}
-
-// Whether `text` means the whole nm that are read from it, or parts of one more, as "0.38um" does
-// not.
-bool NamesWavelength(const std::string& text, std::int64_t wavelength) {
-  std::string_view rest = text;
-  const auto skip_blanks = [&rest] {
-    rest.remove_prefix(std::min(rest.find_first_not_of(" \t"), rest.size()));
-  };
-  skip_blanks();
-  rest.remove_prefix(rest.starts_with('+') ? 1 : 0);
-  double number = 0.0;
-  const auto [stopped, error] = std::from_chars(rest.data(), rest.data() + rest.size(), number);
-  if (error != std::errc() || std::trunc(number) != static_cast<double>(wavelength)) {
-    return false;
-  }
-  rest.remove_prefix(static_cast<std::size_t>(stopped - rest.data()));
-  skip_blanks();
-  if (rest.starts_with("nm")) {
-    rest.remove_prefix(2);
-  }
-  skip_blanks();
-  return rest.empty();
 }
 
 // The header that a load reads from the elements of an unknown attribute.  Nothing is known of
@@ -293,7 +270,7 @@ void DocumentChecker::CheckRange(const Conditions& conditions) {
   try {
     const WavelengthSteps steps(conditions, 1);
     const std::string first = conditions.GetAttribute(ConditionKeys::kWavelengthMin, "380");
-    if (!NamesWavelength(first, steps.first)) {
+    if (!IsInNanometres(first)) {
       Add("the first wavelength, " + Quoted(first) + ", would be written as " +
           std::to_string(steps.first));
     }

@@ -8,6 +8,7 @@
 
 #include "aldermoor/utilities/tools/lexicalcast.h"
 #include "aldermoor/vexdoc/conditionkeys.h"
+#include "aldermoor/vexdoc/internals/attributerules.h"
 #include "aldermoor/vexdoc/internals/customillumination.h"
 #include "aldermoor/vexdoc/internals/faulttext.h"
 
@@ -16,6 +17,7 @@ namespace Aldermoor::Vexdoc::Internals {
 namespace {
 
 constexpr const char* kBlanks = " \t\n\v\f\r";
+constexpr const char* kDigits = "0123456789";
 constexpr const char* kDefaultMin = "380";
 constexpr const char* kDefaultMax = "730";
 
@@ -60,27 +62,33 @@ bool IsWavelengthMisread(const std::string& text) {
 }
 
 bool SaysOtherThanItsNumber(const std::string& text) {
-  const std::size_t digits = text.find_first_of("0123456789");
-  std::size_t rest = text.find_first_not_of("0123456789", digits);
-  if (rest != std::string::npos && text[rest] == '.') {
-    rest = text.find_first_not_of('0', rest + 1);
+  const std::size_t digits = text.find_first_of(kDigits);
+  const std::size_t point = text.find_first_not_of(kDigits, digits);
+  const bool has_part =
+      point != std::string::npos && text[point] == '.' &&
+      text.find_first_of("123456789", point) < text.find_first_not_of(kDigits, point + 1);
+  return has_part || !IsInNanometres(text);
+}
+
+bool IsInNanometres(const std::string& text) {
+  const std::size_t digits = text.find_first_of(kDigits);
+  std::size_t unit = text.find_first_not_of(kDigits, digits);
+  if (unit != std::string::npos && text[unit] == '.') {
+    unit = text.find_first_not_of(kDigits, unit + 1);
   }
-  rest = rest == std::string::npos ? rest : text.find_first_not_of(kBlanks, rest);
-  if (rest == std::string::npos) {
-    return false;
-  }
-  return text.substr(rest, text.find_last_not_of(kBlanks) + 1 - rest) != "nm";
+  unit = unit == std::string::npos ? unit : text.find_first_not_of(kBlanks, unit);
+  return unit == std::string::npos ||
+         text.substr(unit, text.find_last_not_of(kBlanks) + 1 - unit) == "nm";
 }
 
 bool AreOfConditions(const Wavelengths& points, const Conditions& conditions) {
-  const std::int64_t minimum = RangeEnd(conditions, ConditionKeys::kWavelengthMin, kDefaultMin);
-  const std::int64_t maximum = RangeEnd(conditions, ConditionKeys::kWavelengthMax, kDefaultMax);
-  const auto intervals = static_cast<std::int64_t>(points.size()) - 1;
-  const std::int64_t step = intervals < 1 ? 0 : (maximum - minimum) / intervals;
-  std::int64_t expected = minimum;
+  const WavelengthSteps steps(RangeEnd(conditions, ConditionKeys::kWavelengthMin, kDefaultMin),
+                              RangeEnd(conditions, ConditionKeys::kWavelengthMax, kDefaultMax),
+                              points.size());
+  std::int64_t expected = steps.first;
   return std::all_of(points.begin(), points.end(), [&](unsigned int point) {
     const bool is_it = point == expected;
-    expected += step;
+    expected += steps.step;
     return is_it;
   });
 }

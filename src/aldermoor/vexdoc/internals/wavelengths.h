@@ -30,7 +30,11 @@ std::optional<std::int16_t> ReadWavelength(const std::string& text);
 /// "4e2". "400.0 nm" does not.
 bool SaysOtherThanItsNumber(const std::string& text);
 
-/// The same of a condition, and whether a number is read from it at all.
+/// Whether nothing but a fraction and "nm" stands behind the whole number with which `text` begins:
+/// "0.38um" is of another unit.
+bool IsInNanometres(const std::string& text);
+
+/// SaysOtherThanItsNumber of a condition, and whether a number is read from it at all.
 bool IsWavelengthMisread(const std::string& text);
 
 /// Whether `points` are those that a save would write for as many values under `conditions`: from
